@@ -1,0 +1,34 @@
+# The two commands of the README: `make demo` and `make test`. Each installs
+# what is missing (Debian packages), configures, builds and runs.
+PYTHON   := /usr/bin/python3
+BUILD    ?= build
+PACKAGES := cmake ninja-build g++ python3-dev python3-pytest python3-clang-14
+BENCH_PACKAGES := pybind11-dev
+
+.PHONY: all deps build test demo bench clean
+
+all: build
+
+deps:
+	@./.ci/apt-install $(PACKAGES)
+
+$(BUILD)/build.ninja:
+	cmake -S . -B $(BUILD) -G Ninja
+
+build: deps $(BUILD)/build.ninja
+	cmake --build $(BUILD)
+
+test: build
+	cmake --build $(BUILD) --target test-support
+	$(BUILD)/bin/host_selftest
+	$(PYTHON) -m pytest -q tests
+
+demo: build
+	$(PYTHON) examples/module_summary.py
+
+bench: build
+	@./.ci/apt-install $(BENCH_PACKAGES)
+	@echo "no benchmarks yet"
+
+clean:
+	rm -rf $(BUILD)

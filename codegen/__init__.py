@@ -1,0 +1,1 @@
+"""The binding generator: host headers -> model -> C++ and Python sources."""

@@ -1,0 +1,81 @@
+"""Command line of the binding generator.
+
+  python3 -m codegen outputs  MANIFEST                 files a run writes, one per line
+  python3 -m codegen generate MANIFEST --include DIR --cxx-out DIR --py-out DIR
+"""
+from __future__ import annotations
+
+import argparse
+import os
+import sys
+
+from . import manifest as manifest_mod
+from . import model as model_mod
+from . import parse as parse_mod
+from .emit import entries, header, init, proxy, table, types
+
+
+def cxx_outputs(m: manifest_mod.Manifest) -> list[str]:
+    families = sorted({c.family for c in m.classes})
+    return ([f'{m.proxy}_wrap.h', 'types.cpp', 'method_table.cpp', 'module_init.cpp']
+            + [f'{f}.cpp' for f in families])
+
+
+def render(module: model_mod.Module) -> dict[str, str]:
+    files = {f'{module.ident}_wrap.h': header.emit(module),
+             'types.cpp': types.emit(module),
+             'method_table.cpp': table.emit(module),
+             'module_init.cpp': init.emit(module)}
+    for family in module.families:
+        files[f'{family}.cpp'] = entries.emit(module, family)
+    return files
+
+
+def load_module(manifest_path: str, include_dirs: list[str]) -> model_mod.Module:
+    m = manifest_mod.load(manifest_path, os.path.relpath(manifest_path))
+    headers = parse_mod.parse([c.header for c in m.classes], include_dirs, m.namespace)
+    return model_mod.build(m, headers)
+
+
+def _write(path: str, text: str):
+    """Writes only when the text changed, so unchanged sources are not rebuilt."""
+    try:
+        with open(path, encoding='utf-8') as f:
+            if f.read() == text:
+                return
+    except FileNotFoundError:
+        pass
+    os.makedirs(os.path.dirname(path), exist_ok=True)
+    with open(path, 'w', encoding='utf-8') as f:
+        f.write(text)
+
+
+def main(argv: list[str]) -> int:
+    ap = argparse.ArgumentParser(prog='codegen')
+    sub = ap.add_subparsers(dest='cmd', required=True)
+    o = sub.add_parser('outputs')
+    o.add_argument('manifest')
+    g = sub.add_parser('generate')
+    g.add_argument('manifest')
+    g.add_argument('--include', action='append', required=True)
+    g.add_argument('--cxx-out', required=True)
+    g.add_argument('--py-out', required=True)
+    args = ap.parse_args(argv)
+
+    if args.cmd == 'outputs':
+        m = manifest_mod.load(args.manifest)
+        print('\n'.join(cxx_outputs(m)))
+        return 0
+    try:
+        module = load_module(args.manifest, args.include)
+    except (parse_mod.ParseError, model_mod.GeneratorError, manifest_mod.ManifestError) as e:
+        print(f'codegen: {e}', file=sys.stderr)
+        return 1
+    for name, text in render(module).items():
+        _write(os.path.join(args.cxx_out, name), text)
+    _write(os.path.join(args.py_out, f'{module.proxy}.py'), proxy.emit(module))
+    return 0
+
+
+if __name__ == '__main__':
+    sys.exit(main(sys.argv[1:]))

@@ -1,0 +1,24 @@
+"""The private header shared by a module's generated sources."""
+from __future__ import annotations
+
+from .common import banner, namespace_close, namespace_open
+from ..model import Module
+
+
+def emit(module: Module) -> str:
+    out = [banner(module, 'declarations shared by the generated sources'), '#pragma once\n\n',
+           '#include "swigrt.h"\n#include "errors.h"\n#include "args.h"\n#include "dispatch.h"\n\n']
+    out += [f'#include <{h}>\n' for h in module.headers]
+    if module.namespace:
+        out.append(f'\nusing namespace {module.namespace};\n')
+    out.append('\n' + namespace_open(module))
+    out.append(f'\nextern swig_type_info *swig_types[{len(module.descriptors) + 1}];\n'
+               'extern swig_module_info swig_module;\n'
+               'extern PyMethodDef module_methods[];\nextern PyMethodDef proxydoc_methods[];\n\n')
+    out += [f'#define {d.macro} swig_types[{d.index}]\n' for d in module.descriptors]
+    out.append('\n')
+    for e in module.entries:
+        if not e.function.startswith('swigrt::'):
+            out.append(f'PyObject *{e.function}(PyObject *self, PyObject *args);\n')
+    out.append('\n' + namespace_close(module))
+    return ''.join(out)

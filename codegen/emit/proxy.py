@@ -1,0 +1,72 @@
+"""The Python proxy module: one Python class per wrapped class, built from the
+extension's flat functions."""
+from __future__ import annotations
+
+from .common import banner
+from ..model import Module, WrappedClass
+
+_PRELUDE = '''
+import weakref
+
+from . import {ext} as _ext
+{imports}
+
+def _thisown_get(self):
+    return self.this.own()
+
+
+def _thisown_set(self, value):
+    self.this.own(value)
+
+
+def _proxy_repr(self):
+    try:
+        this = repr(self.this)
+    except AttributeError:
+        this = 'no object'
+    return f'<{{type(self).__module__}}.{{type(self).__qualname__}}; proxy of {{this}} >'
+
+
+cvar = _ext.cvar
+
+'''
+
+
+def _class(cls: WrappedClass) -> str:
+    base = cls.python_base or 'object'
+    n = cls.name
+    out = [f'\nclass {n}({base}):\n',
+           '    thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")\n',
+           '    __repr__ = _proxy_repr\n\n']
+    ctor = cls.constructor
+    if ctor is None:
+        out.append('    def __init__(self, *args, **kwargs):\n'
+                   f'        raise AttributeError("No constructor defined for {n}")\n\n')
+    elif ctor.takes_self:
+        out.append('    def __init__(self, *args):\n'
+                   f'        _self = None if type(self) is {n} else self\n'
+                   f'        _ext.{n}_swiginit(self, _ext.new_{n}(_self, *args))\n\n')
+    else:
+        out.append('    def __init__(self, *args):\n'
+                   f'        _ext.{n}_swiginit(self, _ext.new_{n}(*args))\n\n')
+    out.append(f'    __swig_destroy__ = _ext.delete_{n}\n')
+    if cls.director:
+        out.append('\n    def __disown__(self):\n'
+                   '        self.this.disown()\n'
+                   f'        _ext.disown_{n}(self)\n'
+                   '        return weakref.proxy(self)\n')
+    if cls.constants:
+        out.append('\n')
+        out += [f'    {c.name[len(n) + 1:]} = _ext.{c.name}\n' for c in cls.constants]
+    out.append(f'\n\n_ext.{n}_swigregister({n})\n')
+    return ''.join(out)
+
+
+def emit(module: Module) -> str:
+    imports = ''.join(f'from . import {m}\n' for m in module.imports)
+    out = [banner(module, f'Python classes over {module.name}', '#'),
+           f'"""Python classes of the {module.proxy} interface."""\n',
+           _PRELUDE.format(ext=module.name, imports=imports)]
+    out += [f'{c.name} = _ext.{c.name}\n' for c in module.start_constants if isinstance(c.value, str)]
+    out += [_class(c) for c in module.classes]
+    return ''.join(out)

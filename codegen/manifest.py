@@ -1,0 +1,66 @@
+"""Loads a module manifest: the classes to wrap, in registration order, and
+the few facts that the headers cannot express."""
+from __future__ import annotations
+
+import tomllib
+from dataclasses import dataclass, field
+
+
+@dataclass
+class ClassEntry:
+    name: str
+    family: str
+    director: bool = True
+    header: str = ''
+
+
+@dataclass
+class Manifest:
+    name: str                      # extension module name, "_OpenVorlaVPx"
+    proxy: str                     # generated Python module, "OpenVorlaVPx"
+    namespace: str                 # SDK namespace stripped from names
+    classes: list[ClassEntry]
+    header_dir: str = 'openvorla'  # where "<Class>.h" lives below the include dir
+    api_version_macro: str = ''
+    string_constants: list[str] = field(default_factory=list)
+    imports: list[str] = field(default_factory=list)       # sibling proxy modules
+    types: dict[str, str] = field(default_factory=dict)    # mangled -> readable
+    bases: dict[str, str] = field(default_factory=dict)    # known-by-name class -> base
+    casts: dict[str, list[str]] = field(default_factory=dict)  # target -> sources
+    source: str = ''               # manifest path as given, for banners
+
+
+class ManifestError(Exception):
+    pass
+
+
+def load(path: str, display_name: str | None = None) -> Manifest:
+    with open(path, 'rb') as f:
+        data = tomllib.load(f)
+    try:
+        mod = data['module']
+        classes = []
+        for c in mod['classes']:
+            unknown = set(c) - {'name', 'family', 'director', 'header'}
+            if unknown:
+                raise ManifestError(f'{path}: class {c.get("name")}: unknown keys {sorted(unknown)}')
+            classes.append(ClassEntry(c['name'], c['family'], c.get('director', True),
+                                      c.get('header', '')))
+        m = Manifest(
+            name=mod['name'], proxy=mod['proxy'], namespace=mod.get('namespace', ''),
+            classes=classes, header_dir=mod.get('header_dir', 'openvorla'),
+            api_version_macro=mod.get('api_version_macro', ''),
+            string_constants=list(mod.get('string_constants', [])),
+            imports=list(mod.get('imports', [])),
+            types=dict(data.get('types', {})), bases=dict(data.get('bases', {})),
+            casts={k: list(v) for k, v in data.get('casts', {}).items()},
+            source=display_name or path)
+    except KeyError as e:
+        raise ManifestError(f'{path}: missing key {e}') from None
+    for c in m.classes:
+        if not c.header:
+            c.header = f'{m.header_dir}/{c.name}.h'
+    names = [c.name for c in m.classes]
+    if len(set(names)) != len(names):
+        raise ManifestError(f'{path}: a class is listed twice')
+    return m
