@@ -39,6 +39,8 @@ def spell(t: CType) -> str:
     if t.kind in ('builtin', 'record', 'enum', 'typedef'):
         return t.name + const
     if t.kind == 'pointer':
+        if t.inner.kind == 'array':
+            return f'{spell(t.inner.inner)} (*)[{t.inner.size}]' + const
         return spell(t.inner) + ' *' + const
     if t.kind == 'lvref':
         return spell(t.inner) + ' &'

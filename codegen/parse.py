@@ -18,9 +18,10 @@ T = ci.TypeKind
 @dataclass(frozen=True)
 class CType:
     """A C++ type as declared. `kind` is one of builtin, record, enum, typedef,
-    pointer, lvref, rvref, array, function, memberptr."""
+    pointer, lvref, rvref, array, function, memberptr, unexposed."""
     kind: str
-    name: str = ''             # builtin spelling or qualified name
+    name: str = ''             # builtin spelling, qualified name, or the spelling
+                               # of an 'unexposed' type the reader cannot take apart
     const: bool = False
     inner: 'CType | None' = None   # pointee, element, typedef target, result
     size: int = 0              # array length
@@ -142,8 +143,9 @@ class _Reader:
             return CType('memberptr', const=const, inner=self.ctype(t.get_pointee()),
                          owner=self.qualified(t.get_class_type().get_declaration()))
         spelling = t.spelling.replace('const ', '').replace(' const', '').strip()
-        if k == T.UNEXPOSED or k == T.INVALID:
-            raise ParseError(f'cannot read type {t.spelling!r}')
+        if not (T.VOID.value <= t.get_canonical().kind.value <= T.NULLPTR.value):
+            # Templates and the like: recorded, and refused by the model if it needs them.
+            return CType('unexposed', spelling, const)
         return CType('builtin', spelling, const)
 
     def params(self, cursor) -> list[Param]:
@@ -175,6 +177,8 @@ class _Reader:
     def read_class(self, cursor, header: str) -> Class:
         cls = Class(self.qualified(cursor), header, abstract=cursor.is_abstract_record())
         for c in cursor.get_children():
+            if c.kind != K.CXX_BASE_SPECIFIER and _access(c) == 'private':
+                continue
             if c.kind == K.CXX_BASE_SPECIFIER:
                 cls.bases.append((self.qualified(c.type.get_declaration()), _access(c)))
             elif c.kind == K.CONSTRUCTOR:
