@@ -6,6 +6,7 @@ installation order, message texts. Emitters only print what this builds.
 from __future__ import annotations
 
 import codecs
+import re
 import hashlib
 import struct
 from dataclasses import dataclass, field
@@ -16,6 +17,13 @@ from .parse import Class, CType, Function, Headers, Param
 METH_VARARGS = 1
 METH_NOARGS = 4
 METH_O = 8
+
+# Scalar parameter types and the routine that converts each.
+SCALAR_CONVERTERS = {'int': 'AsInt', 'unsigned int': 'AsUnsignedInt', 'short': 'AsShort',
+                     'unsigned char': 'AsUnsignedChar', 'char': 'AsChar', 'bool': 'AsBool',
+                     'double': 'AsDouble', 'float': 'AsFloat'}
+_NULL_DEFAULTS = frozenset({'0', 'NULL', 'nullptr'})
+_LITERAL = re.compile(r'-?(\d+(\.\d*)?([eE]-?\d+)?[fFuUlL]*|true|false)')
 
 # Host types that cross the boundary through the scripting engine's own
 # conversions, not as wrapped pointers, when they are arguments or results.
@@ -107,11 +115,15 @@ class Arg:
     number: int                  # counted from 1, the Python object of a director class included
     param: str                   # C++ parameter name
     spelling: str
-    descriptor: Descriptor
-    reference: bool
-    cpp: str                     # the class the converted pointer points to
+    kind: str                    # 'object' (a wrapped pointer) or 'scalar'
+    cpp: str                     # object: the class pointed to; scalar: the local's type
     message: str
-    null_message: str | None
+    descriptor: Descriptor | None = None
+    reference: bool = False
+    null_message: str | None = None
+    converter: str = ''          # scalar: the convert/ routine
+    cast: str | None = None      # scalar: the enumeration the local is cast to
+    default: str | None = None   # C++ value when the argument is absent
 
 
 @dataclass
@@ -305,17 +317,36 @@ class _Builder:
             out.append((base, base in self.h.classes))
             name = base
 
-    def object_arg(self, number: int, p: Param, entry: str) -> Arg:
+    def arg(self, number: int, p: Param, entry: str) -> Arg:
+        """How argument `number` of `entry` is converted, and its messages."""
         t = p.type
+        unsupported = GeneratorError(f'{entry}: parameter {p.name} of type {spell(t)} '
+                                     'has no conversion yet')
+        if t.kind == 'enum' or (t.kind == 'builtin' and t.name in SCALAR_CONVERTERS):
+            s = spell(_unqualified(t))
+            message = f"in method '{entry}', argument {number} of type '{s}'"
+            default = None
+            if p.default is not None:
+                default = _scalar_default(t, p.default)
+                if default is None:
+                    raise unsupported
+            if t.kind == 'enum':
+                return Arg(number, p.name, s, 'scalar', 'int', message, converter='AsInt',
+                           cast=t.name, default=default)
+            return Arg(number, p.name, s, 'scalar', t.name, message,
+                       converter=SCALAR_CONVERTERS[t.name], default=default)
         if t.kind not in ('pointer', 'lvref') or t.inner.kind != 'record' \
                 or t.inner.name in ENGINE_CONVERTED:
-            raise GeneratorError(f'{entry}: parameter {p.name} of type {spell(t)} '
-                                 'has no conversion yet')
+            raise unsupported
         s = spell(t)
         message = f"in method '{entry}', argument {number} of type '{s}'"
         ref = t.kind == 'lvref'
-        return Arg(number, p.name, s, self.type_descriptor(t), ref, t.inner.name, message,
-                   'invalid null reference ' + message if ref else None)
+        if p.default is not None and (ref or p.default not in _NULL_DEFAULTS):
+            raise unsupported
+        return Arg(number, p.name, s, 'object', t.inner.name, message,
+                   descriptor=self.type_descriptor(t), reference=ref,
+                   null_message='invalid null reference ' + message if ref else None,
+                   default='nullptr' if p.default is not None else None)
 
     def constructor(self, cls: Class, director: bool) -> Constructor | None:
         public = [c for c in cls.constructors if c.access == 'public']
@@ -331,7 +362,7 @@ class _Builder:
         first = 2 if director else 1
         cands = []
         for i, ctor in enumerate(usable):
-            args = [self.object_arg(first + j, p, entry) for j, p in enumerate(ctor.params)]
+            args = [self.arg(first + j, p, entry) for j, p in enumerate(ctor.params)]
             required = sum(1 for p in ctor.params if p.default is None)
             proto = f"{cls.name}::{cls.name}({','.join(spell(p.type) for p in ctor.params)})"
             fn = f'wrap_{entry}' if len(usable) == 1 else f'wrap_{entry}_{i + 1}'
@@ -451,6 +482,17 @@ class _Builder:
             raise GeneratorError(f'{name} is not a string macro of the headers')
         raw = codecs.escape_decode(text[1:-1].encode())[0]
         return raw.decode('utf-8', 'surrogateescape')
+
+
+def _scalar_default(t: CType, text: str) -> str | None:
+    """The C++ value of a default argument, usable outside the class: a
+    literal, or an enumerator qualified by its enumeration's scope."""
+    if _LITERAL.fullmatch(text):
+        return text
+    if t.kind == 'enum' and re.fullmatch(r'[A-Za-z_]\w*', text):
+        scope = t.name.rpartition('::')[0]
+        return f'{scope}::{text}' if scope else text
+    return None
 
 
 def _is_copy(f: Function, cls: str) -> bool:

@@ -9,27 +9,44 @@ from ..model import (METH_NOARGS, METH_O, Arg, Candidate, Constructor, DispatchR
 
 def _convert(a: Arg) -> str:
     slot = f'argv[{a.number - 1}]'
-    var = f'argp{a.number}'
-    if a.reference:
-        call = (f'swigrt::ReferenceArg({slot}, {a.descriptor.macro}, &{var}, '
-                f'{c_string(a.message)}, {c_string(a.null_message)})')
+    if a.kind == 'scalar':
+        var = f'arg{a.number}'
+        local = f'  {a.cpp} {var}' + (f' = {a.default};\n' if a.default else ';\n')
+        call = f'swigrt::ScalarArg(swigrt::{a.converter}({slot}, &{var}), {c_string(a.message)})'
     else:
-        call = f'swigrt::PointerArg({slot}, {a.descriptor.macro}, 0, &{var}, {c_string(a.message)})'
-    return f'  void *{var} = nullptr;\n  if (!{call}) return nullptr;\n'
+        var = f'argp{a.number}'
+        local = f'  void *{var} = nullptr;\n'
+        if a.reference:
+            call = (f'swigrt::ReferenceArg({slot}, {a.descriptor.macro}, &{var}, '
+                    f'{c_string(a.message)}, {c_string(a.null_message)})')
+        else:
+            call = (f'swigrt::PointerArg({slot}, {a.descriptor.macro}, 0, &{var}, '
+                    f'{c_string(a.message)})')
+    present = f'{slot} && ' if a.default else ''
+    return f'{local}  if ({present}!{call}) return nullptr;\n'
+
+
+def _value(a: Arg) -> str:
+    if a.kind == 'scalar':
+        return f'static_cast<{a.cast}>(arg{a.number})' if a.cast else f'arg{a.number}'
+    if a.reference:
+        return f'*static_cast<{a.cpp} *>(argp{a.number})'
+    return f'static_cast<{a.cpp} *>(argp{a.number})'
 
 
 def _construct(cls: WrappedClass, ctor: Constructor, cand: Candidate) -> str:
     if ctor.refuse_plain:
         return (f'  swigrt::SetErrorMessage(PyExc_RuntimeError, {c_string(REFUSE_PLAIN)});\n'
                 '  return nullptr;\n')
-    values = [(f'*static_cast<{a.cpp} *>(argp{a.number})' if a.reference
-               else f'static_cast<{a.cpp} *>(argp{a.number})') for a in cand.args]
+    values = [_value(a) for a in cand.args]
     return (f'  {cls.name} *result = new {cls.name}({", ".join(values)});\n'
             f'  return swigrt::NewPointerObj(nullptr, result, {cls.descriptor.macro}, '
             'SWIG_POINTER_NEW);\n')
 
 
 def _check(a: Arg) -> str:
+    if a.kind == 'scalar':
+        return f'SWIG_IsOK(swigrt::{a.converter}(argv[{a.number - 1}], nullptr))'
     flags = 'SWIG_POINTER_NO_NULL' if a.reference else '0'
     return f'SWIG_IsOK(swigrt::ConvertPtr(argv[{a.number - 1}], nullptr, {a.descriptor.macro}, {flags}))'
 
@@ -69,7 +86,8 @@ def _constructor(cls: WrappedClass, ctor: Constructor) -> str:
             count = f'argc != {cand.min_args}'
         else:
             count = f'argc < {cand.min_args} || argc > {cand.max_args}'
-        out.append(f'static PyObject *{cand.function}(Py_ssize_t argc, PyObject **argv) {{\n'
+        argv = 'PyObject **argv' if cand.args else '[[maybe_unused]] PyObject **argv'
+        out.append(f'static PyObject *{cand.function}(Py_ssize_t argc, {argv}) {{\n'
                    f'  if ({count}) return nullptr;\n'
                    + ''.join(_convert(a) for a in cand.args) + _construct(cls, ctor, cand) + '}\n\n')
     branches = ' else '.join(_dispatch_branch(r) for r in ctor.dispatch)

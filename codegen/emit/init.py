@@ -53,10 +53,10 @@ def emit(module: Module) -> str:
                f'    PyModuleDef_HEAD_INIT, {c_string(module.name)}, nullptr, -1, module_methods,\n'
                '    nullptr, nullptr, nullptr, nullptr};\n\n')
     out.append('// The explicit constants, stored before the link object exists.\n'
-               'void install_start_constants(PyObject *d) {\n')
+               'void install_start_constants([[maybe_unused]] PyObject *d) {\n')
     out += [_constant(c) for c in module.start_constants]
     out.append('}\n\n// The constants of the other classes, class by class.\n'
-               'void install_class_constants(PyObject *d) {\n')
+               'void install_class_constants([[maybe_unused]] PyObject *d) {\n')
     out += [_constant(c) for c in module.installs if isinstance(c, Constant)]
     out.append('}\n\nPyObject *init_module() {\n'
                '  swigrt::ThisString();\n'

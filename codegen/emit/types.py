@@ -11,14 +11,16 @@ def _var(name: str) -> str:
 
 def emit(module: Module) -> str:
     out = [banner(module, 'the type table'), f'#include "{module.ident}_wrap.h"\n\n',
-           namespace_open(module), '\nnamespace {\n\n']
+           namespace_open(module), '\nnamespace {\n\n',
+           '// Converters of the cast lists. Classes the module knows only by name\n'
+           '// derive singly, with the base at the start of the object.\n']
     for d in module.descriptors:
         for c in d.casts:
             if c.derived_cpp:
                 body = (f'return static_cast<{c.base_cpp} *>'
                         f'(static_cast<{c.derived_cpp} *>(x));')
             else:
-                body = 'return x;  // single inheritance, base at offset 0'
+                body = 'return x;'
             out.append(f'void *{c.converter}(void *x, int *) {{ {body} }}\n')
     out.append('\n')
     for d in module.descriptors:

@@ -6,6 +6,7 @@
 #include "errors.h"
 #include "args.h"
 #include "dispatch.h"
+#include "scalars.h"
 
 #include <sdk/Base.h>
 #include <sdk/Base.h>

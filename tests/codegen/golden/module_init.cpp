@@ -38,7 +38,7 @@ PyModuleDef module_def = {
     nullptr, nullptr, nullptr, nullptr};
 
 // The explicit constants, stored before the link object exists.
-void install_start_constants(PyObject *d) {
+void install_start_constants([[maybe_unused]] PyObject *d) {
   swigrt::SetConstant(d, "SDK_MAKER", PyUnicode_DecodeUTF8(SDK_MAKER, sizeof(SDK_MAKER) - 1, "surrogateescape"));
   swigrt::SetConstant(d, "Node_kPlain", PyLong_FromLong(static_cast<long>(Node::kPlain)));
   swigrt::SetConstant(d, "Node_kGroup", PyLong_FromLong(static_cast<long>(Node::kGroup)));
@@ -47,7 +47,7 @@ void install_start_constants(PyObject *d) {
 }
 
 // The constants of the other classes, class by class.
-void install_class_constants(PyObject *d) {
+void install_class_constants([[maybe_unused]] PyObject *d) {
 }
 
 PyObject *init_module() {

@@ -6,11 +6,13 @@ namespace Fixture_wrap {
 
 namespace {
 
+// Converters of the cast lists. Classes the module knows only by name
+// derive singly, with the base at the start of the object.
 void *cast_p_MeshTo_p_Node(void *x, int *) { return static_cast<Node *>(static_cast<Mesh *>(x)); }
 void *cast_p_ShapeTo_p_Node(void *x, int *) { return static_cast<Node *>(static_cast<Shape *>(x)); }
-void *cast_p_HelperTo_p_Root(void *x, int *) { return x;  // single inheritance, base at offset 0 }
+void *cast_p_HelperTo_p_Root(void *x, int *) { return x; }
 void *cast_p_MeshTo_p_Shape(void *x, int *) { return static_cast<Shape *>(static_cast<Mesh *>(x)); }
-void *cast_p_intPtrTo_p_int(void *x, int *) { return x;  // single inheritance, base at offset 0 }
+void *cast_p_intPtrTo_p_int(void *x, int *) { return x; }
 
 swig_type_info type_p_Abstract = {"_p_Abstract", "Abstract *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_Helper = {"_p_Helper", "Helper *", nullptr, nullptr, nullptr, 0};

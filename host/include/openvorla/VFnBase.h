@@ -1,0 +1,26 @@
+// Base of the function sets, which operate on a host object.
+#pragma once
+
+#include <openvorla/VApiVersion.h>
+#include <openvorla/VFn.h>
+#include <openvorla/VObject.h>
+
+OPENVORLA_NAMESPACE_OPEN
+
+class OPENVORLA_EXPORT VFnBase {
+public:
+  virtual ~VFnBase();
+
+  virtual VFn::Type type() const;
+  VObject object() const;  // the object operated on; null when none is attached
+  // Whether this function set can operate on objects of the given kind.
+  bool hasObj(VFn::Type type) const;
+
+protected:
+  VFnBase();
+
+private:
+  VObject fObject;
+};
+
+OPENVORLA_NAMESPACE_CLOSE

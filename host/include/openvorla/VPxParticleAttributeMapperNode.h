@@ -1,0 +1,29 @@
+// Base class of plug-in mappers of per-particle attributes.
+#pragma once
+
+#include <openvorla/VApiVersion.h>
+#include <openvorla/VObject.h>
+#include <openvorla/VPxNode.h>
+
+OPENVORLA_NAMESPACE_OPEN
+
+class OPENVORLA_EXPORT VPxParticleAttributeMapperNode : public VPxNode {
+public:
+  VPxParticleAttributeMapperNode();
+  ~VPxParticleAttributeMapperNode() override;
+
+  static VObject computeNode;
+  static VObject uCoordPP;
+  static VObject vCoordPP;
+  static VObject outMinValue;
+  static VObject outMaxValue;
+  static VObject computeNodeColor;
+  static VObject computeNodeColorR;
+  static VObject computeNodeColorG;
+  static VObject computeNodeColorB;
+  static VObject time;
+  static VObject outColorPP;
+  static VObject outValuePP;
+};
+
+OPENVORLA_NAMESPACE_CLOSE

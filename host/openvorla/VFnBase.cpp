@@ -1,0 +1,12 @@
+// VFnBase: the common part of the function sets.
+#include <openvorla/VFnBase.h>
+
+OPENVORLA_NAMESPACE_OPEN
+
+VFnBase::VFnBase() = default;
+VFnBase::~VFnBase() = default;
+VFn::Type VFnBase::type() const { return VFn::kBase; }
+VObject VFnBase::object() const { return fObject; }
+bool VFnBase::hasObj(VFn::Type type) const { return type == this->type(); }
+
+OPENVORLA_NAMESPACE_CLOSE

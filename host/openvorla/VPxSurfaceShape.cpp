@@ -1,0 +1,73 @@
+// VPxSurfaceShape: construction and the static attribute objects.
+#include <openvorla/VPxSurfaceShape.h>
+
+#include <standin/Lifetime.h>
+#include <standin/Objects.h>
+
+OPENVORLA_NAMESPACE_OPEN
+
+VPxSurfaceShape::VPxSurfaceShape() { standin::noteConstructed("VPxSurfaceShape"); }
+VPxSurfaceShape::~VPxSurfaceShape() { standin::noteDestroyed("VPxSurfaceShape"); }
+
+VObject VPxSurfaceShape::mHasHistoryOnCreate =
+    standin::makeAttribute("VPxSurfaceShape.mHasHistoryOnCreate");
+VObject VPxSurfaceShape::mControlPoints = standin::makeAttribute("VPxSurfaceShape.mControlPoints");
+VObject VPxSurfaceShape::mControlValueX = standin::makeAttribute("VPxSurfaceShape.mControlValueX");
+VObject VPxSurfaceShape::mControlValueY = standin::makeAttribute("VPxSurfaceShape.mControlValueY");
+VObject VPxSurfaceShape::mControlValueZ = standin::makeAttribute("VPxSurfaceShape.mControlValueZ");
+VObject VPxSurfaceShape::nodeBoundingBox =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBox");
+VObject VPxSurfaceShape::nodeBoundingBoxMin =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxMin");
+VObject VPxSurfaceShape::nodeBoundingBoxMinX =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxMinX");
+VObject VPxSurfaceShape::nodeBoundingBoxMinY =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxMinY");
+VObject VPxSurfaceShape::nodeBoundingBoxMinZ =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxMinZ");
+VObject VPxSurfaceShape::nodeBoundingBoxMax =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxMax");
+VObject VPxSurfaceShape::nodeBoundingBoxMaxX =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxMaxX");
+VObject VPxSurfaceShape::nodeBoundingBoxMaxY =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxMaxY");
+VObject VPxSurfaceShape::nodeBoundingBoxMaxZ =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxMaxZ");
+VObject VPxSurfaceShape::nodeBoundingBoxSize =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxSize");
+VObject VPxSurfaceShape::nodeBoundingBoxSizeX =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxSizeX");
+VObject VPxSurfaceShape::nodeBoundingBoxSizeY =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxSizeY");
+VObject VPxSurfaceShape::nodeBoundingBoxSizeZ =
+    standin::makeAttribute("VPxSurfaceShape.nodeBoundingBoxSizeZ");
+VObject VPxSurfaceShape::center = standin::makeAttribute("VPxSurfaceShape.center");
+VObject VPxSurfaceShape::boundingBoxCenterX =
+    standin::makeAttribute("VPxSurfaceShape.boundingBoxCenterX");
+VObject VPxSurfaceShape::boundingBoxCenterY =
+    standin::makeAttribute("VPxSurfaceShape.boundingBoxCenterY");
+VObject VPxSurfaceShape::boundingBoxCenterZ =
+    standin::makeAttribute("VPxSurfaceShape.boundingBoxCenterZ");
+VObject VPxSurfaceShape::matrix = standin::makeAttribute("VPxSurfaceShape.matrix");
+VObject VPxSurfaceShape::inverseMatrix = standin::makeAttribute("VPxSurfaceShape.inverseMatrix");
+VObject VPxSurfaceShape::worldMatrix = standin::makeAttribute("VPxSurfaceShape.worldMatrix");
+VObject VPxSurfaceShape::worldInverseMatrix =
+    standin::makeAttribute("VPxSurfaceShape.worldInverseMatrix");
+VObject VPxSurfaceShape::parentMatrix = standin::makeAttribute("VPxSurfaceShape.parentMatrix");
+VObject VPxSurfaceShape::parentInverseMatrix =
+    standin::makeAttribute("VPxSurfaceShape.parentInverseMatrix");
+VObject VPxSurfaceShape::visibility = standin::makeAttribute("VPxSurfaceShape.visibility");
+VObject VPxSurfaceShape::intermediateObject =
+    standin::makeAttribute("VPxSurfaceShape.intermediateObject");
+VObject VPxSurfaceShape::isTemplated = standin::makeAttribute("VPxSurfaceShape.isTemplated");
+VObject VPxSurfaceShape::instObjGroups = standin::makeAttribute("VPxSurfaceShape.instObjGroups");
+VObject VPxSurfaceShape::objectGroups = standin::makeAttribute("VPxSurfaceShape.objectGroups");
+VObject VPxSurfaceShape::objectGrpCompList =
+    standin::makeAttribute("VPxSurfaceShape.objectGrpCompList");
+VObject VPxSurfaceShape::objectGroupId = standin::makeAttribute("VPxSurfaceShape.objectGroupId");
+VObject VPxSurfaceShape::objectGroupColor =
+    standin::makeAttribute("VPxSurfaceShape.objectGroupColor");
+VObject VPxSurfaceShape::useObjectColor = standin::makeAttribute("VPxSurfaceShape.useObjectColor");
+VObject VPxSurfaceShape::objectColor = standin::makeAttribute("VPxSurfaceShape.objectColor");
+
+OPENVORLA_NAMESPACE_CLOSE

@@ -1,0 +1,34 @@
+// VPxFieldNode: construction and the static attribute objects.
+#include <openvorla/VPxFieldNode.h>
+
+#include <standin/Lifetime.h>
+#include <standin/Objects.h>
+
+OPENVORLA_NAMESPACE_OPEN
+
+VPxFieldNode::VPxFieldNode() { standin::noteConstructed("VPxFieldNode"); }
+VPxFieldNode::~VPxFieldNode() { standin::noteDestroyed("VPxFieldNode"); }
+
+VObject VPxFieldNode::mMagnitude = standin::makeAttribute("VPxFieldNode.mMagnitude");
+VObject VPxFieldNode::mAttenuation = standin::makeAttribute("VPxFieldNode.mAttenuation");
+VObject VPxFieldNode::mMaxDistance = standin::makeAttribute("VPxFieldNode.mMaxDistance");
+VObject VPxFieldNode::mUseMaxDistance = standin::makeAttribute("VPxFieldNode.mUseMaxDistance");
+VObject VPxFieldNode::mApplyPerVertex = standin::makeAttribute("VPxFieldNode.mApplyPerVertex");
+VObject VPxFieldNode::mInputData = standin::makeAttribute("VPxFieldNode.mInputData");
+VObject VPxFieldNode::mInputPositions = standin::makeAttribute("VPxFieldNode.mInputPositions");
+VObject VPxFieldNode::mInputVelocities = standin::makeAttribute("VPxFieldNode.mInputVelocities");
+VObject VPxFieldNode::mInputMass = standin::makeAttribute("VPxFieldNode.mInputMass");
+VObject VPxFieldNode::mDeltaTime = standin::makeAttribute("VPxFieldNode.mDeltaTime");
+VObject VPxFieldNode::mInputForce = standin::makeAttribute("VPxFieldNode.mInputForce");
+VObject VPxFieldNode::mOutputForce = standin::makeAttribute("VPxFieldNode.mOutputForce");
+VObject VPxFieldNode::mOwnerCentroidX = standin::makeAttribute("VPxFieldNode.mOwnerCentroidX");
+VObject VPxFieldNode::mOwnerCentroidY = standin::makeAttribute("VPxFieldNode.mOwnerCentroidY");
+VObject VPxFieldNode::mOwnerCentroidZ = standin::makeAttribute("VPxFieldNode.mOwnerCentroidZ");
+VObject VPxFieldNode::mOwnerCentroid = standin::makeAttribute("VPxFieldNode.mOwnerCentroid");
+VObject VPxFieldNode::mOwnerPosData = standin::makeAttribute("VPxFieldNode.mOwnerPosData");
+VObject VPxFieldNode::mOwnerVelData = standin::makeAttribute("VPxFieldNode.mOwnerVelData");
+VObject VPxFieldNode::mWorldMatrix = standin::makeAttribute("VPxFieldNode.mWorldMatrix");
+VObject VPxFieldNode::mInputPPData = standin::makeAttribute("VPxFieldNode.mInputPPData");
+VObject VPxFieldNode::mOwnerPPData = standin::makeAttribute("VPxFieldNode.mOwnerPPData");
+
+OPENVORLA_NAMESPACE_CLOSE

@@ -1,0 +1,18 @@
+// VPxMaterialInformation: construction and destruction.
+#include <openvorla/VPxMaterialInformation.h>
+
+#include <standin/Lifetime.h>
+
+OPENVORLA_NAMESPACE_OPEN
+
+VPxMaterialInformation::VPxMaterialInformation(VObject &) {
+  standin::noteConstructed("VPxMaterialInformation");
+}
+VPxMaterialInformation::VPxMaterialInformation(VObject &, const VObject &) {
+  standin::noteConstructed("VPxMaterialInformation");
+}
+VPxMaterialInformation::~VPxMaterialInformation() {
+  standin::noteDestroyed("VPxMaterialInformation");
+}
+
+OPENVORLA_NAMESPACE_CLOSE

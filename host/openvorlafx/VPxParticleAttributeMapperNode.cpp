@@ -1,0 +1,41 @@
+// VPxParticleAttributeMapperNode: construction and the static attribute objects.
+#include <openvorla/VPxParticleAttributeMapperNode.h>
+
+#include <standin/Lifetime.h>
+#include <standin/Objects.h>
+
+OPENVORLA_NAMESPACE_OPEN
+
+VPxParticleAttributeMapperNode::VPxParticleAttributeMapperNode() {
+  standin::noteConstructed("VPxParticleAttributeMapperNode");
+}
+VPxParticleAttributeMapperNode::~VPxParticleAttributeMapperNode() {
+  standin::noteDestroyed("VPxParticleAttributeMapperNode");
+}
+
+VObject VPxParticleAttributeMapperNode::computeNode =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.computeNode");
+VObject VPxParticleAttributeMapperNode::uCoordPP =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.uCoordPP");
+VObject VPxParticleAttributeMapperNode::vCoordPP =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.vCoordPP");
+VObject VPxParticleAttributeMapperNode::outMinValue =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.outMinValue");
+VObject VPxParticleAttributeMapperNode::outMaxValue =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.outMaxValue");
+VObject VPxParticleAttributeMapperNode::computeNodeColor =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.computeNodeColor");
+VObject VPxParticleAttributeMapperNode::computeNodeColorR =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.computeNodeColorR");
+VObject VPxParticleAttributeMapperNode::computeNodeColorG =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.computeNodeColorG");
+VObject VPxParticleAttributeMapperNode::computeNodeColorB =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.computeNodeColorB");
+VObject VPxParticleAttributeMapperNode::time =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.time");
+VObject VPxParticleAttributeMapperNode::outColorPP =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.outColorPP");
+VObject VPxParticleAttributeMapperNode::outValuePP =
+    standin::makeAttribute("VPxParticleAttributeMapperNode.outValuePP");
+
+OPENVORLA_NAMESPACE_CLOSE
