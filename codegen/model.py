@@ -364,7 +364,8 @@ class _Builder:
         for i, ctor in enumerate(usable):
             args = [self.arg(first + j, p, entry) for j, p in enumerate(ctor.params)]
             required = sum(1 for p in ctor.params if p.default is None)
-            proto = f"{cls.name}::{cls.name}({','.join(spell(p.type) for p in ctor.params)})"
+            types = (['PyObject *'] if director else []) + [spell(p.type) for p in ctor.params]
+            proto = f"{cls.name}::{cls.name}({','.join(types)})"
             fn = f'wrap_{entry}' if len(usable) == 1 else f'wrap_{entry}_{i + 1}'
             base = first - 1
             cands.append(Candidate(fn, proto, base + required, base + len(ctor.params),

@@ -94,9 +94,9 @@ def test_overloaded_constructor_dispatch_and_message(fixture):
     assert pair.message == (
         "Wrong number or type of arguments for overloaded function 'new_Pair'.\n"
         '  Possible C/C++ prototypes are:\n'
-        '    Pair::Pair(Value &)\n'
-        '    Pair::Pair(Value &,Node const &)\n'
-        '    Pair::Pair(Node *,Value &,Value &)\n')
+        '    Pair::Pair(PyObject *,Value &)\n'
+        '    Pair::Pair(PyObject *,Value &,Node const &)\n'
+        '    Pair::Pair(PyObject *,Node *,Value &,Value &)\n')
     first = pair.candidates[1].args[1]
     assert first.message == "in method 'new_Pair', argument 3 of type 'Node const &'"
     assert first.null_message == 'invalid null reference ' + first.message

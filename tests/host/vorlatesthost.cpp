@@ -28,6 +28,10 @@ PyObject *DescriptorTuple(const swig_type_info *ty) {
   return Py_BuildValue("(sz)", ty->name, ty->str);
 }
 
+PyObject *DescriptorRecord(swig_type_info *ty) {
+  return Py_BuildValue("(szN)", ty->name, ty->str, PyLong_FromVoidPtr(ty));
+}
+
 // convert_ptr(obj, type_name, flags) -> (status, address, own)
 PyObject *convert_ptr(PyObject *, PyObject *args) {
   PyObject *obj, *name;
@@ -95,7 +99,7 @@ PyObject *cast_list(PyObject *, PyObject *arg) {
   return out;
 }
 
-// modules() -> per module sharing the table, its descriptors as (name, readable)
+// modules() -> per module sharing the table, its descriptors as (name, readable, address)
 PyObject *modules(PyObject *, PyObject *) {
   swig_module_info *first = SharedTable();
   if (!first) return nullptr;
@@ -104,7 +108,7 @@ PyObject *modules(PyObject *, PyObject *) {
   do {
     PyObject *types = PyList_New(0);
     for (size_t i = 0; types && i < m->size; ++i) {
-      PyObject *t = DescriptorTuple(m->types[i]);
+      PyObject *t = DescriptorRecord(m->types[i]);
       if (!t || PyList_Append(types, t) < 0) Py_CLEAR(types);
       Py_XDECREF(t);
     }

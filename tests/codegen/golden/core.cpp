@@ -156,7 +156,7 @@ PyObject *wrap_new_Pair(PyObject *, PyObject *args) {
     result = wrap_new_Pair_3(argc, argv);
   }
   if (!swigrt::DispatchFailed(result)) return result;
-  swigrt::RaiseOrModifyTypeError("Wrong number or type of arguments for overloaded function 'new_Pair'.\n  Possible C/C++ prototypes are:\n    Pair::Pair(Value &)\n    Pair::Pair(Value &,Node const &)\n    Pair::Pair(Node *,Value &,Value &)\n");
+  swigrt::RaiseOrModifyTypeError("Wrong number or type of arguments for overloaded function 'new_Pair'.\n  Possible C/C++ prototypes are:\n    Pair::Pair(PyObject *,Value &)\n    Pair::Pair(PyObject *,Value &,Node const &)\n    Pair::Pair(PyObject *,Node *,Value &,Value &)\n");
   return nullptr;
 }
 
