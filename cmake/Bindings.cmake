@@ -10,7 +10,8 @@ function(openvorla_binding manifest)
   cmake_parse_arguments(B "" "" "LIBS" ${ARGN})
   set(manifest_path ${CMAKE_SOURCE_DIR}/${manifest})
   get_filename_component(stem ${manifest} NAME_WE)
-  set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${manifest_path})
+  set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS
+    ${manifest_path} ${CMAKE_SOURCE_DIR}/codegen/__main__.py)
 
   # The file list depends only on the manifest, so it is known at configure time.
   execute_process(

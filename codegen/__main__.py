@@ -12,12 +12,13 @@ import sys
 from . import manifest as manifest_mod
 from . import model as model_mod
 from . import parse as parse_mod
-from .emit import entries, header, init, proxy, table, types
+from .emit import entries, header, init, proxy, table, types, variables
 
 
 def cxx_outputs(m: manifest_mod.Manifest) -> list[str]:
     families = sorted({c.family for c in m.classes})
-    return ([f'{m.proxy}_wrap.h', 'types.cpp', 'method_table.cpp', 'module_init.cpp']
+    return ([f'{m.proxy}_wrap.h', 'types.cpp', 'method_table.cpp', 'module_init.cpp',
+             'variables.cpp']
             + [f'{f}.cpp' for f in families])
 
 
@@ -25,7 +26,8 @@ def render(module: model_mod.Module) -> dict[str, str]:
     files = {f'{module.ident}_wrap.h': header.emit(module),
              'types.cpp': types.emit(module),
              'method_table.cpp': table.emit(module),
-             'module_init.cpp': init.emit(module)}
+             'module_init.cpp': init.emit(module),
+             'variables.cpp': variables.emit(module)}
     for family in module.families:
         files[f'{family}.cpp'] = entries.emit(module, family)
     return files

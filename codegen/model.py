@@ -168,9 +168,19 @@ class Constant:
 class GlobalVariable:
     name: str                     # Python name, "VPxNode_message"
     cpp: str                      # "VPxNode::message"
-    spelling: str
+    spelling: str                 # the value type, "VObject"
     descriptor: Descriptor
     readonly: bool
+
+    @property
+    def message(self) -> str:
+        if self.readonly:
+            return f'Variable {self.name} is read-only.'
+        return f"in variable '{self.cpp}' of type '{self.spelling}'"
+
+    @property
+    def null_message(self) -> str:
+        return 'invalid null reference ' + self.message
 
 
 @dataclass

@@ -26,3 +26,33 @@ inline bool ReferenceArg(PyObject *obj, swig_type_info *ty, void **out, const ch
 }
 
 }  // namespace swigrt
+
+namespace swigrt {
+
+// The setter of a writable static variable: copies the converted value into
+// `target` with T's assignment; 0 on success, 1 with the variable's error set.
+template <class T>
+int AssignVariable(PyObject *value, T &target, swig_type_info *ty, const char *message,
+                   const char *null_message) {
+  void *argp = nullptr;
+  int res = ConvertPtr(value, &argp, ty, 0);
+  if (!SWIG_IsOK(res)) {
+    SetErrorMessage(ErrorTypeFor(SWIG_ArgError(res)), message);
+    return 1;
+  }
+  if (!argp) {
+    SetErrorMessage(ErrorTypeFor(SWIG_ValueError), null_message);
+    return 1;
+  }
+  target = *static_cast<T *>(argp);
+  if (SWIG_IsNewObj(res)) delete static_cast<T *>(argp);
+  return 0;
+}
+
+// The setter of a read-only variable.
+inline int RefuseVariable(const char *message) {
+  SetErrorMessage(ErrorTypeFor(SWIG_AttributeError), message);
+  return 1;
+}
+
+}  // namespace swigrt

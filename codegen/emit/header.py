@@ -2,6 +2,7 @@
 from __future__ import annotations
 
 from .common import banner, namespace_close, namespace_open
+from . import variables
 from ..model import Module
 
 
@@ -20,5 +21,9 @@ def emit(module: Module) -> str:
     for e in module.entries:
         if not e.function.startswith('swigrt::'):
             out.append(f'PyObject *{e.function}(PyObject *self, PyObject *args);\n')
+    if module.variables:
+        out.append('\n')
+    for v in module.variables:
+        out.append(f'PyObject *{variables.getter(v)}();\nint {variables.setter(v)}(PyObject *value);\n')
     out.append('\n' + namespace_close(module))
     return ''.join(out)

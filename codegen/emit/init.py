@@ -3,7 +3,8 @@ data the host reads from the plug-in file."""
 from __future__ import annotations
 
 from .common import banner, c_string, namespace_close, namespace_open
-from ..model import Constant, Module
+from . import variables
+from ..model import Constant, GlobalVariable, Module
 
 
 def _exports(module: Module) -> str:
@@ -42,6 +43,11 @@ def _constant(c: Constant) -> str:
     return f'  swigrt::SetConstant(d, {c_string(c.name)}, {value});\n'
 
 
+def _variable(v: GlobalVariable) -> str:
+    return (f'  swigrt::AddVariable(globals, {c_string(v.name)}, {variables.getter(v)}, '
+            f'{variables.setter(v)});\n')
+
+
 def emit(module: Module) -> str:
     out = [banner(module, 'module initialisation'), f'#include "{module.ident}_wrap.h"\n\n']
     if module.api_version:
@@ -55,9 +61,10 @@ def emit(module: Module) -> str:
     out.append('// The explicit constants, stored before the link object exists.\n'
                'void install_start_constants([[maybe_unused]] PyObject *d) {\n')
     out += [_constant(c) for c in module.start_constants]
-    out.append('}\n\n// The constants of the other classes, class by class.\n'
-               'void install_class_constants([[maybe_unused]] PyObject *d) {\n')
-    out += [_constant(c) for c in module.installs if isinstance(c, Constant)]
+    out.append('}\n\n// Class by class: its constants, then its variables.\n'
+               'void install_class_members([[maybe_unused]] PyObject *d, '
+               '[[maybe_unused]] PyObject *globals) {\n')
+    out += [_constant(c) if isinstance(c, Constant) else _variable(c) for c in module.installs]
     out.append('}\n\nPyObject *init_module() {\n'
                '  swigrt::ThisString();\n'
                '  swigrt::TypeCache();\n'
@@ -77,7 +84,7 @@ def emit(module: Module) -> str:
                '    return nullptr;\n'
                '  }\n'
                '  PyDict_SetItemString(d, "cvar", globals);\n'
-               '  install_class_constants(d);\n'
+               '  install_class_members(d, globals);\n'
                '  return m;\n'
                '}\n\n}  // namespace\n\n')
     out.append(namespace_close(module))

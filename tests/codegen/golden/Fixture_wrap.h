@@ -65,4 +65,11 @@ PyObject *wrap_new_Value(PyObject *self, PyObject *args);
 PyObject *wrap_delete_Value(PyObject *self, PyObject *args);
 PyObject *wrap_Value_swigregister(PyObject *self, PyObject *args);
 
+PyObject *get_Node_caching();
+int set_Node_caching(PyObject *value);
+PyObject *get_Node_identity();
+int set_Node_identity(PyObject *value);
+PyObject *get_Value_kEmpty();
+int set_Value_kEmpty(PyObject *value);
+
 }  // namespace Fixture_wrap

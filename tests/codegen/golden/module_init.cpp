@@ -46,8 +46,11 @@ void install_start_constants([[maybe_unused]] PyObject *d) {
   swigrt::SetConstant(d, "Node_kNone", PyLong_FromLong(static_cast<long>(Node::kNone)));
 }
 
-// The constants of the other classes, class by class.
-void install_class_constants([[maybe_unused]] PyObject *d) {
+// Class by class: its constants, then its variables.
+void install_class_members([[maybe_unused]] PyObject *d, [[maybe_unused]] PyObject *globals) {
+  swigrt::AddVariable(globals, "Node_caching", get_Node_caching, set_Node_caching);
+  swigrt::AddVariable(globals, "Node_identity", get_Node_identity, set_Node_identity);
+  swigrt::AddVariable(globals, "Value_kEmpty", get_Value_kEmpty, set_Value_kEmpty);
 }
 
 PyObject *init_module() {
@@ -68,7 +71,7 @@ PyObject *init_module() {
     return nullptr;
   }
   PyDict_SetItemString(d, "cvar", globals);
-  install_class_constants(d);
+  install_class_members(d, globals);
   return m;
 }
 

@@ -1,0 +1,37 @@
+"""Getters and setters of the static variables reached through `cvar`."""
+from __future__ import annotations
+
+from .common import banner, c_string, namespace_close, namespace_open
+from ..model import GlobalVariable, Module
+
+
+def getter(v: GlobalVariable) -> str:
+    return f'get_{v.name}'
+
+
+def setter(v: GlobalVariable) -> str:
+    return f'set_{v.name}'
+
+
+def _pair(v: GlobalVariable) -> str:
+    # The wrapper points at the host's static itself and never owns it.
+    address = f'const_cast<{v.spelling} *>(&{v.cpp})' if v.readonly else f'&{v.cpp}'
+    out = [f'PyObject *{getter(v)}() {{\n'
+           f'  return swigrt::NewPointerObj(nullptr, {address}, {v.descriptor.macro}, 0);\n}}\n']
+    if v.readonly:
+        out.append(f'int {setter(v)}(PyObject *) {{\n'
+                   f'  return swigrt::RefuseVariable({c_string(v.message)});\n}}\n\n')
+    else:
+        out.append(f'int {setter(v)}(PyObject *value) {{\n'
+                   f'  return swigrt::AssignVariable(value, {v.cpp}, {v.descriptor.macro},\n'
+                   f'                                {c_string(v.message)},\n'
+                   f'                                {c_string(v.null_message)});\n}}\n\n')
+    return ''.join(out)
+
+
+def emit(module: Module) -> str:
+    out = [banner(module, f'the {len(module.variables)} static variables of cvar'),
+           f'#include "{module.ident}_wrap.h"\n\n', namespace_open(module), '\n']
+    out += [_pair(v) for v in module.variables]
+    out.append(namespace_close(module))
+    return ''.join(out)
