@@ -16,7 +16,7 @@ from .emit import entries, header, init, proxy, table, types, variables
 
 
 def cxx_outputs(m: manifest_mod.Manifest) -> list[str]:
-    families = sorted({c.family for c in m.classes})
+    families = sorted({c.family for c in m.classes} | ({'pointers'} if m.pointer_classes else set()))
     return ([f'{m.proxy}_wrap.h', 'types.cpp', 'method_table.cpp', 'module_init.cpp',
              'variables.cpp']
             + [f'{f}.cpp' for f in families])
@@ -30,6 +30,8 @@ def render(module: model_mod.Module) -> dict[str, str]:
              'variables.cpp': variables.emit(module)}
     for family in module.families:
         files[f'{family}.cpp'] = entries.emit(module, family)
+    if module.pointer_classes:
+        files['pointers.cpp'] = entries.emit(module, 'pointers')
     return files
 
 

@@ -7,6 +7,7 @@ tree whose names are relative to the host's SDK namespace.
 from __future__ import annotations
 
 import os
+import re
 from dataclasses import dataclass, field
 
 import clang.cindex as ci
@@ -87,6 +88,13 @@ class ParseError(Exception):
     pass
 
 
+def _join(tokens: list[str]) -> str:
+    """Source text of an expression from its tokens: 'VSpace::kTransform', '-1'."""
+    text = ' '.join(tokens)
+    text = re.sub(r'\s*::\s*', '::', text)
+    return re.sub(r'^([-+])\s+', r'\1', text)
+
+
 def _access(cursor) -> str:
     spec = cursor.access_specifier
     if spec == ci.AccessSpecifier.PROTECTED:
@@ -154,7 +162,7 @@ class _Reader:
             default = None
             tokens = [tok.spelling for tok in arg.get_tokens()]
             if '=' in tokens:
-                default = ' '.join(tokens[tokens.index('=') + 1:])
+                default = _join(tokens[tokens.index('=') + 1:])
             out.append(Param(arg.spelling, self.ctype(arg.type), default))
         return out
 

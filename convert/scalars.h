@@ -127,6 +127,8 @@ inline int AsFloat(PyObject *obj, float *out) {
   return SWIG_OK;
 }
 
+inline PyObject *FromChar(char c) { return PyUnicode_DecodeUTF8(&c, 1, "surrogateescape"); }
+
 // Reports a failed scalar argument with its message; true when `res` is success.
 inline bool ScalarArg(int res, const char *message) {
   if (SWIG_IsOK(res)) return true;

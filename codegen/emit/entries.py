@@ -1,54 +1,146 @@
-"""The entry points of one family of classes: construction, destruction,
-hand-over to the host and class registration."""
+"""The entry points of one family of classes: construction, members,
+destruction, hand-over to the host and class registration; and the entry
+points of the pointer classes."""
 from __future__ import annotations
 
 from .common import banner, c_string, namespace_close, namespace_open
-from ..model import (METH_NOARGS, METH_O, Arg, Candidate, Constructor, DispatchRule, Module,
-                     REFUSE_PLAIN, WrappedClass)
+from ..model import (METH_NOARGS, METH_O, REFUSE_PLAIN, Arg, Candidate, DispatchRule, EntryPoint,
+                     Module, PointerClass, WrappedClass)
+
+
+def _slot(a: Arg) -> str:
+    return f'argv[{a.slot}]'
 
 
 def _convert(a: Arg) -> str:
-    slot = f'argv[{a.number - 1}]'
+    """Declares the argument's local and fills it; a failure returns null."""
+    slot, n = _slot(a), a.number
+    present = f'{slot} && ' if a.optional else ''
     if a.kind == 'scalar':
-        var = f'arg{a.number}'
-        local = f'  {a.cpp} {var}' + (f' = {a.default};\n' if a.default else ';\n')
-        call = f'swigrt::ScalarArg(swigrt::{a.converter}({slot}, &{var}), {c_string(a.message)})'
-    else:
-        var = f'argp{a.number}'
-        local = f'  void *{var} = nullptr;\n'
+        local = f'  {a.cpp} arg{n}' + (f' = {a.default};\n' if a.default else ';\n')
+        call = f'swigrt::ScalarArg(swigrt::{a.converter}({slot}, &arg{n}), {c_string(a.message)})'
+        return f'{local}  if ({present}!{call}) return nullptr;\n'
+    if a.kind == 'object':
         if a.reference:
-            call = (f'swigrt::ReferenceArg({slot}, {a.descriptor.macro}, &{var}, '
+            call = (f'swigrt::ReferenceArg({slot}, {a.descriptor.macro}, &argp{n}, '
                     f'{c_string(a.message)}, {c_string(a.null_message)})')
         else:
-            call = (f'swigrt::PointerArg({slot}, {a.descriptor.macro}, 0, &{var}, '
+            call = (f'swigrt::PointerArg({slot}, {a.descriptor.macro}, 0, &argp{n}, '
                     f'{c_string(a.message)})')
-    present = f'{slot} && ' if a.default else ''
-    return f'{local}  if ({present}!{call}) return nullptr;\n'
+        return f'  void *argp{n} = nullptr;\n  if ({present}!{call}) return nullptr;\n'
+    if a.kind == 'string':
+        return f'  VString arg{n};\n  swigrt::StringArg({slot}, arg{n}, {c_string(a.message)});\n'
+    if a.kind == 'string_array':
+        return (f'  VStringArray arg{n};\n'
+                f'  swigrt::StringArrayArg({slot}, arg{n}, {c_string(a.message)});\n')
+    if a.kind == 'string_ptr':
+        return (f'  VString arg{n};\n'
+                f'  const bool has{n} = {slot} && {slot} != Py_None;\n'
+                f'  if (has{n}) swigrt::StringArg({slot}, arg{n}, {c_string(a.message)});\n')
+    if a.kind == 'chars':
+        call = f'swigrt::ScalarArg(swigrt::AsCharPtr({slot}, &arg{n}), {c_string(a.message)})'
+        out = f'  swigrt::CharsArg arg{n};\n'
+        if a.default and a.default != 'nullptr':
+            out += (f'  if (!{slot}) arg{n}.ptr = const_cast<char *>({a.default});\n'
+                    f'  else if (!{call}) return nullptr;\n')
+        else:
+            out += f'  if ({present}!{call}) return nullptr;\n'
+        return out
+    if a.kind == 'status_out':
+        return f'  VStatus status{n};\n'
+    if a.kind == 'pyobject':
+        return ''
+    raise AssertionError(a.kind)
 
 
 def _value(a: Arg) -> str:
-    if a.kind == 'scalar':
-        return f'static_cast<{a.cast}>(arg{a.number})' if a.cast else f'arg{a.number}'
-    if a.reference:
-        return f'*static_cast<{a.cpp} *>(argp{a.number})'
-    return f'static_cast<{a.cpp} *>(argp{a.number})'
-
-
-def _construct(cls: WrappedClass, ctor: Constructor, cand: Candidate) -> str:
-    if ctor.refuse_plain:
-        return (f'  swigrt::SetErrorMessage(PyExc_RuntimeError, {c_string(REFUSE_PLAIN)});\n'
-                '  return nullptr;\n')
-    values = [_value(a) for a in cand.args]
-    return (f'  {cls.name} *result = new {cls.name}({", ".join(values)});\n'
-            f'  return swigrt::NewPointerObj(nullptr, result, {cls.descriptor.macro}, '
-            'SWIG_POINTER_NEW);\n')
+    n = a.number
+    return {
+        'scalar': lambda: f'static_cast<{a.cast}>(arg{n})' if a.cast else f'arg{n}',
+        'object': lambda: (f'*static_cast<{a.cpp} *>(argp{n})' if a.reference
+                           else f'static_cast<{a.cpp} *>(argp{n})'),
+        'string': lambda: f'arg{n}',
+        'string_array': lambda: f'arg{n}',
+        'string_ptr': lambda: f'has{n} ? &arg{n} : nullptr',
+        'chars': lambda: f'arg{n}.ptr',
+        'status_out': lambda: f'&status{n}',
+        'pyobject': lambda: _slot(a),
+    }[a.kind]()
 
 
 def _check(a: Arg) -> str:
+    """A check-only conversion for an overload dispatcher."""
+    slot = _slot(a)
     if a.kind == 'scalar':
-        return f'SWIG_IsOK(swigrt::{a.converter}(argv[{a.number - 1}], nullptr))'
-    flags = 'SWIG_POINTER_NO_NULL' if a.reference else '0'
-    return f'SWIG_IsOK(swigrt::ConvertPtr(argv[{a.number - 1}], nullptr, {a.descriptor.macro}, {flags}))'
+        return f'SWIG_IsOK(swigrt::{a.converter}({slot}, nullptr))'
+    if a.kind == 'object':
+        flags = 'SWIG_POINTER_NO_NULL' if a.reference else '0'
+        return f'SWIG_IsOK(swigrt::ConvertPtr({slot}, nullptr, {a.descriptor.macro}, {flags}))'
+    if a.kind == 'chars':
+        return f'SWIG_IsOK(swigrt::AsCharPtr({slot}, nullptr))'
+    if a.kind == 'string':
+        return f'PyUnicode_Check({slot})'
+    if a.kind == 'string_ptr':
+        return f'({slot} == Py_None || PyUnicode_Check({slot}))'
+    return f'PyList_Check({slot})'
+
+
+def _result(c: Candidate, call: str) -> str:
+    """Calls the host and makes `resultobj`; a failure returns null."""
+    r = c.result
+    if r.kind == 'void':
+        return f'  {call};\n  PyObject *resultobj = Py_NewRef(Py_None);\n'
+    if r.kind == 'status':
+        return (f'  VStatus result = {call};\n'
+                '  PyObject *resultobj = swigrt::StatusResult(result);\n'
+                '  if (!resultobj) return nullptr;\n')
+    make = {
+        'scalar': lambda: (f'{r.converter}(static_cast<long>({call}))'
+                           if r.converter == 'PyLong_FromLong' else f'{r.converter}({call})'),
+        'chars': lambda: f'swigrt::FromCharPtr({call})',
+        'string': lambda: f'swigrt::FromString({call})',
+        'string_array': lambda: f'swigrt::FromStringArray({call})',
+        'value': lambda: (f'swigrt::NewPointerObj(nullptr, new {r.cpp}({call}), '
+                          f'{r.descriptor.macro}, SWIG_POINTER_OWN)'),
+        'pointer': lambda: (f'swigrt::NewPointerObj(nullptr, const_cast<{r.cpp} *>({call}), '
+                            f'{r.descriptor.macro}, 0)'),
+        'reference': lambda: (f'swigrt::NewPointerObj(nullptr, const_cast<{r.cpp} *>(&{call}), '
+                              f'{r.descriptor.macro}, 0)'),
+    }[r.kind]()
+    return f'  PyObject *resultobj = {make};\n  if (!resultobj) return nullptr;\n'
+
+
+def _after(c: Candidate) -> str:
+    """Output lists are rewritten, then a status reported through a pointer
+    is tested."""
+    out = []
+    for a in c.args:
+        if a.kind == 'string_array' and a.output:
+            not_list, cannot = a.list_messages
+            out.append(f'  if (!swigrt::UpdateOutputList({_slot(a)}, arg{a.number}, '
+                       f'{c_string(not_list)},\n'
+                       f'                                {c_string(cannot)})) {{\n'
+                       '    Py_DECREF(resultobj);\n    return nullptr;\n  }\n')
+    for a in c.args:
+        if a.kind == 'status_out':
+            out.append(f'  if (!swigrt::StatusSucceeded(status{a.number})) {{\n'
+                       '    Py_DECREF(resultobj);\n    return nullptr;\n  }\n')
+    return ''.join(out)
+
+
+def _body(cls: str, ep: EntryPoint, c: Candidate) -> str:
+    out = ''.join(_convert(a) for a in c.args)
+    values = ', '.join(_value(a) for a in c.args if not a.is_self)
+    if not ep.member:
+        if ep.refuse_plain:
+            return out + (f'  swigrt::SetErrorMessage(PyExc_RuntimeError, '
+                          f'{c_string(REFUSE_PLAIN)});\n  return nullptr;\n')
+        out += (f'  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new {cls}({values}), '
+                f'{c.result.descriptor.macro}, SWIG_POINTER_NEW);\n')
+    else:
+        target = f'{cls}::' if c.static else f'static_cast<{cls} *>(argp1)->'
+        out += _result(c, f'{target}{c.call}({values})')
+    return out + _after(c) + '  return resultobj;\n'
 
 
 def _dispatch_branch(rule: DispatchRule) -> str:
@@ -65,39 +157,36 @@ def _dispatch_branch(rule: DispatchRule) -> str:
     return f'if ({cond}) {{\n' + ''.join(lines) + '  }'
 
 
-def _constructor(cls: WrappedClass, ctor: Constructor) -> str:
+def entry_point(cls: str, ep: EntryPoint) -> str:
     def head(param: str) -> str:
-        return f'PyObject *{ctor.function}(PyObject *, PyObject *{param}) {{\n'
+        return f'PyObject *{ep.function}(PyObject *, PyObject *{param}) {{\n'
 
-    if ctor.flags == METH_O:
-        return head('arg') + '  if (!arg) return nullptr;\n' + \
-            _construct(cls, ctor, ctor.candidates[0]) + '}\n'
-    if ctor.flags == METH_NOARGS:
-        return head('') + _construct(cls, ctor, ctor.candidates[0]) + '}\n'
-    if len(ctor.candidates) == 1:
-        cand = ctor.candidates[0]
-        return (head('args') + f'  PyObject *argv[{cand.max_args}] = {{}};\n'
-                f'  if (!swigrt::UnpackTuple(args, {c_string(ctor.entry)}, {cand.min_args}, '
-                f'{cand.max_args}, argv)) return nullptr;\n'
-                + ''.join(_convert(a) for a in cand.args) + _construct(cls, ctor, cand) + '}\n')
+    if not ep.dispatch:
+        c = ep.candidates[0]
+        if ep.flags == METH_O:
+            argv = '  PyObject *argv[1] = {arg};\n' if any(a.slot is not None for a in c.args) else ''
+            return head('arg') + '  if (!arg) return nullptr;\n' + argv + _body(cls, ep, c) + '}\n'
+        if ep.flags == METH_NOARGS:
+            return head('') + _body(cls, ep, c) + '}\n'
+        return (head('args') + f'  PyObject *argv[{max(c.max_args, 1)}] = {{}};\n'
+                f'  if (!swigrt::UnpackTuple(args, {c_string(ep.entry)}, {c.min_args}, '
+                f'{c.max_args}, argv)) return nullptr;\n' + _body(cls, ep, c) + '}\n')
     out = []
-    for cand in ctor.candidates:
-        if cand.min_args == cand.max_args:
-            count = f'argc != {cand.min_args}'
-        else:
-            count = f'argc < {cand.min_args} || argc > {cand.max_args}'
-        argv = 'PyObject **argv' if cand.args else '[[maybe_unused]] PyObject **argv'
-        out.append(f'static PyObject *{cand.function}(Py_ssize_t argc, {argv}) {{\n'
-                   f'  if ({count}) return nullptr;\n'
-                   + ''.join(_convert(a) for a in cand.args) + _construct(cls, ctor, cand) + '}\n\n')
-    branches = ' else '.join(_dispatch_branch(r) for r in ctor.dispatch)
-    out.append(head('args') + f'  PyObject *argv[{ctor.max_args}] = {{}};\n'
-               f'  Py_ssize_t argc = swigrt::UnpackTuple(args, {c_string(ctor.entry)}, 0, '
-               f'{ctor.max_args}, argv) - 1;\n'
+    for c in ep.candidates:
+        count = (f'argc != {c.min_args}' if c.min_args == c.max_args
+                 else f'argc < {c.min_args} || argc > {c.max_args}')
+        argv = 'PyObject **argv' if any(a.slot is not None for a in c.args) \
+            else '[[maybe_unused]] PyObject **argv'
+        out.append(f'static PyObject *{c.function}(Py_ssize_t argc, {argv}) {{\n'
+                   f'  if ({count}) return nullptr;\n' + _body(cls, ep, c) + '}\n\n')
+    branches = ' else '.join(_dispatch_branch(r) for r in ep.dispatch)
+    out.append(head('args') + f'  PyObject *argv[{ep.max_args}] = {{}};\n'
+               f'  Py_ssize_t argc = swigrt::UnpackTuple(args, {c_string(ep.entry)}, 0, '
+               f'{ep.max_args}, argv) - 1;\n'
                '  PyObject *result = nullptr;\n'
                f'  {branches}\n'
                '  if (!swigrt::DispatchFailed(result)) return result;\n'
-               f'  swigrt::RaiseOrModifyTypeError({c_string(ctor.message)});\n'
+               f'  swigrt::RaiseOrModifyTypeError({c_string(ep.message)});\n'
                '  return nullptr;\n}\n')
     return ''.join(out)
 
@@ -107,12 +196,13 @@ def _class(cls: WrappedClass) -> str:
     msg = c_string(f"in method '{cls.delete_entry}', argument 1 of type '{cls.name} *'")
     out = [f'// {cls.name}\n\n']
     if cls.constructor:
-        out.append(_constructor(cls, cls.constructor) + '\n')
+        out.append(entry_point(cls.name, cls.constructor) + '\n')
     out.append(f'PyObject *wrap_{cls.delete_entry}(PyObject *, PyObject *arg) {{\n'
                '  if (!arg) return nullptr;\n  void *argp1 = nullptr;\n'
                f'  if (!swigrt::PointerArg(arg, {d}, SWIG_POINTER_DISOWN, &argp1, {msg})) '
                'return nullptr;\n'
                f'  delete static_cast<{cls.name} *>(argp1);\n  Py_RETURN_NONE;\n}}\n\n')
+    out += [entry_point(cls.name, m) + '\n' for m in cls.members]
     if cls.director:
         msg = c_string(f"in method 'disown_{cls.name}', argument 1 of type '{cls.name} *'")
         out.append(f'PyObject *wrap_disown_{cls.name}(PyObject *, PyObject *arg) {{\n'
@@ -124,10 +214,68 @@ def _class(cls: WrappedClass) -> str:
     return ''.join(out)
 
 
+def _pointer_class(p: PointerClass) -> str:
+    own, elem, t = p.descriptor.macro, p.element_descriptor.macro, p.element
+
+    def self_arg(entry: str, target: str = own, spelled: str = f'{p.name} *') -> str:
+        msg = f"in method '{entry}', argument 1 of type '{spelled}'"
+        return (f'  void *argp1 = nullptr;\n  if (!swigrt::ReferenceArg(argv[0], {target}, &argp1, '
+                f'{c_string(msg)}, {c_string("invalid null reference " + msg)})) return nullptr;\n'
+                f'  {t} *cell = static_cast<{t} *>(argp1);\n')
+
+    def one(what: str, body: str) -> str:
+        return (f'PyObject *wrap_{p.entry(what)}(PyObject *, PyObject *arg) {{\n'
+                '  if (!arg) return nullptr;\n  PyObject *argv[1] = {arg};\n' + body + '}\n\n')
+
+    value = {'PyLong_FromLong': 'PyLong_FromLong(static_cast<long>(*cell))'}.get(
+        p.result, f'{p.result}(*cell)')
+    assign_msg = f"in method '{p.entry('assign')}', argument 2 of type '{t}'"
+    delete_msg = f"in method '{p.entry('delete')}', argument 1 of type '{p.name} *'"
+    out = [f'// {p.name}\n\n',
+           f'PyObject *wrap_{p.entry("new")}(PyObject *, PyObject *args) {{\n'
+           '  PyObject *argv[1] = {};\n'
+           f'  if (!swigrt::UnpackTuple(args, {c_string(p.entry("new"))}, 0, 0, argv)) '
+           'return nullptr;\n'
+           f'  return swigrt::NewPointerObj(nullptr, new {t}(), {own}, SWIG_POINTER_NEW);\n}}\n\n',
+           f'PyObject *wrap_{p.entry("delete")}(PyObject *, PyObject *arg) {{\n'
+           '  if (!arg) return nullptr;\n  void *argp1 = nullptr;\n'
+           f'  if (!swigrt::PointerArg(arg, {own}, SWIG_POINTER_DISOWN, &argp1, '
+           f'{c_string(delete_msg)})) return nullptr;\n'
+           f'  delete static_cast<{t} *>(argp1);\n  Py_RETURN_NONE;\n}}\n\n',
+           f'PyObject *wrap_{p.entry("assign")}(PyObject *, PyObject *args) {{\n'
+           '  PyObject *argv[2] = {};\n'
+           f'  if (!swigrt::UnpackTuple(args, {c_string(p.entry("assign"))}, 2, 2, argv)) '
+           'return nullptr;\n' + self_arg(p.entry('assign')) +
+           f'  {t} value;\n'
+           f'  if (!swigrt::ScalarArg(swigrt::{p.converter}(argv[1], &value), '
+           f'{c_string(assign_msg)})) return nullptr;\n'
+           '  *cell = value;\n  Py_RETURN_NONE;\n}\n\n',
+           one('value', self_arg(p.entry('value')) + f'  return {value};\n')]
+    if t == 'char':
+        # The cell read as a C string, and a pointer made from a text argument.
+        frompointer_msg = f"in method '{p.entry('frompointer')}', argument 1 of type 'char *'"
+        out.append(one('cast', self_arg(p.entry('cast')) + '  return swigrt::FromCharPtr(cell);\n'))
+        out.append(one('frompointer',
+                       '  swigrt::CharsArg text;\n'
+                       f'  if (!swigrt::ScalarArg(swigrt::AsCharPtr(argv[0], &text), '
+                       f'{c_string(frompointer_msg)})) return nullptr;\n'
+                       f'  return swigrt::NewPointerObj(nullptr, text.ptr, {own}, 0);\n'))
+    else:
+        out.append(one('cast', self_arg(p.entry('cast')) +
+                       f'  return swigrt::NewPointerObj(nullptr, cell, {elem}, 0);\n'))
+        out.append(one('frompointer', self_arg(p.entry('frompointer'), elem, f'{t} *') +
+                       f'  return swigrt::NewPointerObj(nullptr, cell, {own}, 0);\n'))
+    out.append(f'PyObject *wrap_{p.entry("swigregister")}(PyObject *, PyObject *args) {{\n'
+               f'  return swigrt::RegisterClass(args, {own});\n}}\n\n')
+    return ''.join(out)
+
+
 def emit(module: Module, family: str) -> str:
-    classes = module.families[family]
     out = [banner(module, f'entry points of the {family} family'),
            f'#include "{module.ident}_wrap.h"\n\n', namespace_open(module), '\n']
-    out += [_class(c) for c in classes]
+    if family == 'pointers':
+        out += [_pointer_class(p) for p in module.pointer_classes]
+    else:
+        out += [_class(c) for c in module.families[family]]
     out.append(namespace_close(module))
     return ''.join(out)

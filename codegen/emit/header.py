@@ -8,7 +8,7 @@ from ..model import Module
 
 def emit(module: Module) -> str:
     out = [banner(module, 'declarations shared by the generated sources'), '#pragma once\n\n',
-           '#include "swigrt.h"\n#include "errors.h"\n#include "args.h"\n#include "dispatch.h"\n#include "scalars.h"\n\n']
+           '#include "swigrt.h"\n#include "errors.h"\n#include "args.h"\n#include "dispatch.h"\n#include "scalars.h"\n#include "text.h"\n\n']
     out += [f'#include <{h}>\n' for h in module.headers]
     if module.namespace:
         out.append(f'\nusing namespace {module.namespace};\n')

@@ -3,13 +3,18 @@ extension's flat functions."""
 from __future__ import annotations
 
 from .common import banner
-from ..model import Module, WrappedClass
+from ..model import Module, PointerClass, WrappedClass
 
 _PRELUDE = '''
 import weakref
 
 from . import {ext} as _ext
 {imports}
+# Members are the module's built-ins themselves, bound as methods: a call
+# reaches the entry point without a Python frame in between.
+_instance_method = _ext.SWIG_PyInstanceMethod_New
+_static_method = _ext.SWIG_PyStaticMethod_New
+
 
 def _thisown_get(self):
     return self.this.own()
@@ -28,16 +33,16 @@ def _proxy_repr(self):
 
 
 cvar = _ext.cvar
-
 '''
+
+_COMMON = ('    thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")\n'
+           '    __repr__ = _proxy_repr\n\n')
 
 
 def _class(cls: WrappedClass) -> str:
     base = cls.python_base or 'object'
     n = cls.name
-    out = [f'\nclass {n}({base}):\n',
-           '    thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")\n',
-           '    __repr__ = _proxy_repr\n\n']
+    out = [f'\nclass {n}({base}):\n', _COMMON]
     ctor = cls.constructor
     if ctor is None:
         out.append('    def __init__(self, *args, **kwargs):\n'
@@ -50,6 +55,11 @@ def _class(cls: WrappedClass) -> str:
         out.append('    def __init__(self, *args):\n'
                    f'        _ext.{n}_swiginit(self, _ext.new_{n}(*args))\n\n')
     out.append(f'    __swig_destroy__ = _ext.delete_{n}\n')
+    if cls.members:
+        out.append('\n')
+    for m in cls.members:
+        wrap = '_static_method' if m.static else '_instance_method'
+        out.append(f'    {m.member} = {wrap}(_ext.{m.entry})\n')
     if cls.director:
         out.append('\n    def __disown__(self):\n'
                    '        self.this.disown()\n'
@@ -62,11 +72,26 @@ def _class(cls: WrappedClass) -> str:
     return ''.join(out)
 
 
+def _pointer_class(p: PointerClass) -> str:
+    n = p.name
+    return (f'\nclass {n}(object):\n' + _COMMON +
+            '    def __init__(self):\n'
+            f'        _ext.{n}_swiginit(self, _ext.new_{n}())\n\n'
+            f'    __swig_destroy__ = _ext.delete_{n}\n\n'
+            f'    assign = _instance_method(_ext.{n}_assign)\n'
+            f'    value = _instance_method(_ext.{n}_value)\n'
+            f'    cast = _instance_method(_ext.{n}_cast)\n'
+            f'    frompointer = _static_method(_ext.{n}_frompointer)\n\n\n'
+            f'_ext.{n}_swigregister({n})\n')
+
+
 def emit(module: Module) -> str:
     imports = ''.join(f'from . import {m}\n' for m in module.imports)
     out = [banner(module, f'Python classes over {module.name}', '#'),
            f'"""Python classes of the {module.proxy} interface."""\n',
            _PRELUDE.format(ext=module.name, imports=imports)]
-    out += [f'{c.name} = _ext.{c.name}\n' for c in module.start_constants if isinstance(c.value, str)]
+    out += [f'{c.name} = _ext.{c.name}\n' for c in module.start_constants
+            if isinstance(c.value, str)]
+    out += [_pointer_class(p) for p in module.pointer_classes]
     out += [_class(c) for c in module.classes]
     return ''.join(out)

@@ -4,6 +4,7 @@
 OPENVORLA_NAMESPACE_OPEN
 
 VFnBase::VFnBase() = default;
+VFnBase::VFnBase(const VObject &object) : fObject(object) {}
 VFnBase::~VFnBase() = default;
 VFn::Type VFnBase::type() const { return VFn::kBase; }
 VObject VFnBase::object() const { return fObject; }

@@ -4,8 +4,17 @@
 #define PY_SSIZE_T_CLEAN
 #include <Python.h>
 
+#include <openvorla/VArgList.h>
+#include <openvorla/VCacheSchema.h>
+#include <openvorla/VDataBlock.h>
+#include <openvorla/VEulerRotation.h>
+#include <openvorla/VEvaluationNode.h>
 #include <openvorla/VFnPlugin.h>
+#include <openvorla/VMatrix.h>
+#include <openvorla/VNodeCacheSetupInfo.h>
+#include <openvorla/VPoint.h>
 #include <openvorla/VPxCameraSet.h>
+#include <openvorla/VPxCommand.h>
 #include <openvorla/VPxData.h>
 #include <openvorla/VPxIkSolverNode.h>
 #include <openvorla/VPxNode.h>
@@ -13,8 +22,12 @@
 #include <openvorla/VPxPolyTweakUVInteractiveCommand.h>
 #include <openvorla/VPxTransformationMatrix.h>
 #include <openvorla/VPxUIControl.h>
+#include <openvorla/VQuaternion.h>
 #include <openvorla/VStatus.h>
 #include <openvorla/VStringArray.h>
+#include <openvorla/VSyntax.h>
+#include <openvorla/VTimeRange.h>
+#include <openvorla/VTransformationMatrix.h>
 #include <openvorla/VTypeId.h>
 
 #include <scriptrunner/TapiCast.h>
@@ -26,9 +39,14 @@
 #include <basekit/Tlog.h>
 
 #include <standin/Lifetime.h>
+#include <standin/Nodes.h>
 #include <standin/Objects.h>
+#include <standin/Plugins.h>
 
+#include <climits>
+#include <cmath>
 #include <cstdio>
+#include <cstdlib>
 #include <cstring>
 #include <string>
 #include <thread>
@@ -46,7 +64,7 @@ void check(bool ok, const char *what, const char *file, int line) {
   std::fprintf(stderr, "%s:%d: check failed: %s\n", file, line, what);
 }
 
-#define CHECK(cond) check((cond), #cond, __FILE__, __LINE__)
+#define CHECK(cond) check(static_cast<bool>(cond), #cond, __FILE__, __LINE__)
 
 bool contains(const std::string &text, const char *part) {
   return text.find(part) != std::string::npos;
@@ -280,6 +298,484 @@ void testExceptionReport() {
   });
 }
 
+// Rotates v about the unit axis by angle (Rodrigues), independently of the
+// quaternion code.
+VVector rotated(const VVector &v, const VVector &axis, double angle) {
+  return v * std::cos(angle) + (axis ^ v) * std::sin(angle) +
+         axis * (axis * v) * (1.0 - std::cos(angle));
+}
+
+void testRotations() {
+  // Right-handed: a quarter turn about z takes x to y.
+  VVector turned = VVector(1, 0, 0) * VQuaternion(M_PI / 2, VVector(0, 0, 1)).asMatrix();
+  CHECK(turned.isEquivalent(VVector(0, 1, 0)));
+
+  VQuaternion a(0.7, VVector(1, 2, 3)), b(-1.1, VVector(0, 1, -1));
+  CHECK((a * b).asMatrix().isEquivalent(a.asMatrix() * b.asMatrix()));
+  CHECK(VQuaternion(a.asMatrix()).isEquivalent(a) && VQuaternion(a.asMatrix()).isEquivalent(-a));
+  CHECK((a * a.inverse()).isEquivalent(VQuaternion()));
+
+  // Every order decomposes back to the same rotation, at gimbal lock too, and
+  // gives back its own angles while the middle one is within (-pi/2, pi/2).
+  std::srand(7);
+  auto angle = [] { return (std::rand() / double(RAND_MAX) - 0.5) * 6.0; };
+  int failures = 0;
+  for (int order = VEulerRotation::kXYZ; order <= VEulerRotation::kZYX; ++order)
+    for (int n = 0; n < 200; ++n) {
+      VEulerRotation e(angle(), angle(), angle(), VEulerRotation::RotationOrder(order));
+      if (n % 50 == 0) e.y = e.z = M_PI / 2;
+      VEulerRotation back = VEulerRotation::decompose(e.asMatrix(), e.order);
+      if (!back.asMatrix().isEquivalent(e.asMatrix(), 1e-9) || back.order != e.order) ++failures;
+    }
+  CHECK(failures == 0);
+  VEulerRotation small(0.3, -0.4, 1.2, VEulerRotation::kYXZ);
+  CHECK(
+      VEulerRotation::decompose(small.asMatrix(), VEulerRotation::kYXZ).isEquivalent(small, 1e-9));
+  // kYXZ rotates about y first: the product of the single-axis matrices.
+  VMatrix byHand = VQuaternion(-0.4, VVector(0, 1, 0)).asMatrix() *
+                   VQuaternion(0.3, VVector(1, 0, 0)).asMatrix() *
+                   VQuaternion(1.2, VVector(0, 0, 1)).asMatrix();
+  CHECK(small.asMatrix().isEquivalent(byHand));
+  CHECK(small.reorder(VEulerRotation::kZYX).asQuaternion().isEquivalent(small.asQuaternion()));
+}
+
+void testTransformationMatrix() {
+  const VVector t(1, 2, 3), s(2, 0.5, -1.5), sh(0.2, -0.3, 0.4), spt(0.5, 0, -0.5), rpt(-1, 1, 0);
+  const VPoint sp(1, -1, 2), rp(-2, 0.5, 1);
+  const VVector axis = VVector(1, 1, 0).normal(), roAxis = VVector(0, 0.6, 0.8);
+  const double angle = 0.9, roAngle = -0.4;
+
+  VPxTransformationMatrix m;
+  CHECK(m.translateTo(t) == VStatus::kSuccess && m.scaleTo(s) && m.shearTo(sh));
+  CHECK(m.rotateTo(VQuaternion(angle, axis)) &&
+        m.setRotateOrientation(VQuaternion(roAngle, roAxis), VSpace::kTransform, false));
+  CHECK(m.setScalePivot(sp, VSpace::kTransform, false) &&
+        m.setRotatePivot(rp, VSpace::kTransform, false));
+  CHECK(m.setScalePivotTranslation(spt) && m.setRotatePivotTranslation(rpt));
+
+  CHECK(m.getTranslation() == t && m.getScale() == s && m.getShear() == sh);
+  CHECK(m.getRotation().isEquivalent(VQuaternion(angle, axis)));
+  CHECK(m.getRotateOrientation(VSpace::kWorld).isEquivalent(VQuaternion(roAngle, roAxis)));
+  CHECK(m.getScalePivot() == sp && m.getRotatePivot() == rp && m.rotatePivot() == rp);
+  CHECK(m.getScalePivotTranslation() == spt && m.getRotatePivotTranslation() == rpt);
+
+  // The composition, point by point: scale and shear about the scale pivot,
+  // then orientation and rotation about the rotate pivot, then translation.
+  const VPoint p(0.3, -0.7, 1.1);
+  VVector v = p.asVector() - sp.asVector();
+  v = VVector(v.x * s.x + v.y * s.y * sh.x + v.z * s.z * sh.y, v.y * s.y + v.z * s.z * sh.z,
+              v.z * s.z);
+  v = v + sp.asVector() + spt - rp.asVector();
+  v = rotated(rotated(v, roAxis, roAngle), axis, angle);
+  v = v + rp.asVector() + rpt + t;
+  VMatrix composed = m.asMatrix();
+  CHECK((p * composed).isEquivalent(VPoint(v)));
+  CHECK((composed * m.asMatrixInverse()).isEquivalent(VMatrix()));
+  CHECK((m.asScaleMatrix() * m.asRotateMatrix())
+            .setTranslation(VVector())
+            .isEquivalent(VMatrix(composed).setTranslation(VVector())));
+  CHECK(m.asMatrix(0.0).isEquivalent(VMatrix()) && m.asMatrix(1.0).isEquivalent(composed));
+
+  // Balanced changes of pivots and orientation leave the matrix as it was.
+  VPxTransformationMatrix balanced(m);
+  CHECK(balanced.isEquivalent(m) && !balanced.isEquivalent(VPxTransformationMatrix::identity));
+  CHECK(balanced.setRotatePivot(VPoint(3, 3, 3)) && balanced.setScalePivot(VPoint(-1, 4, 0)));
+  CHECK(balanced.setRotateOrientation(VEulerRotation(0.5, 0.1, -0.2)));
+  CHECK(balanced.asMatrix().isEquivalent(composed, 1e-9) &&
+        balanced.getRotatePivot() == VPoint(3, 3, 3));
+  VPxTransformationMatrix moved(m);
+  moved.setRotatePivot(VPoint(3, 3, 3), VSpace::kTransform, false);
+  CHECK(!moved.asMatrix().isEquivalent(composed, 1e-6));
+
+  // Decomposition keeps pivots and orientation; a reflection survives.
+  VMatrix extra = VEulerRotation(0.2, -0.6, 1.0).asMatrix();
+  extra(0, 0) *= -2.0;
+  extra.setTranslation(VVector(5, -4, 3));
+  VPxTransformationMatrix applied(m);
+  CHECK(applied.transformUsing(extra) && applied.asMatrix().isEquivalent(composed * extra, 1e-9));
+  CHECK(applied.getRotatePivot() == rp &&
+        applied.getRotateOrientation().isEquivalent(VQuaternion(roAngle, roAxis)));
+  CHECK(applied.transformUsing(extra, VSpace::kPostTransform) &&
+        applied.asMatrix().isEquivalent(extra * composed * extra, 1e-8));
+  VPxTransformationMatrix reset;
+  CHECK(reset.resetTransformation(composed) && reset.asMatrix().isEquivalent(composed, 1e-9));
+  CHECK(reset.getRotatePivot() == VPoint() && reset.getShear() != VVector());
+  VMatrix singular;
+  singular(1, 1) = 0.0;
+  CHECK(reset.resetTransformation(singular) == VStatus::kInvalidParameter &&
+        reset.asMatrix().isEquivalent(composed, 1e-9));
+  CHECK(reset.resetTransformation() && reset.asMatrix() == VMatrix());
+  CHECK(reset.copyValues(&m) && reset.isEquivalent(m, 0.0) && reset.copyValues(nullptr).error());
+
+  // Euler angles read in the matrix's order; changing the order keeps the
+  // rotation unless told to keep the angles.
+  VPxTransformationMatrix euler;
+  CHECK(euler.setRotationOrder(VTransformationMatrix::kZXY));
+  CHECK(euler.rotateTo(VEulerRotation(0.1, 0.2, 0.3, VEulerRotation::kZXY)));
+  VEulerRotation read = euler.getEulerRotation();
+  CHECK(read.order == VEulerRotation::kZXY &&
+        read.isEquivalent(VEulerRotation(0.1, 0.2, 0.3, VEulerRotation::kZXY), 1e-9));
+  VQuaternion before = euler.getRotation();
+  CHECK(euler.setRotationOrder(VTransformationMatrix::kYXZ) &&
+        euler.getRotation().isEquivalent(before));
+  CHECK(euler.setRotationOrder(VTransformationMatrix::kZXY) &&
+        euler.setRotationOrder(VTransformationMatrix::kXYZ, false));
+  CHECK(!euler.getRotation().isEquivalent(before, 1e-6) &&
+        euler.getEulerRotation().isEquivalent(VEulerRotation(0.1, 0.2, 0.3), 1e-9));
+  CHECK(euler.setRotationOrder(VTransformationMatrix::kInvalid) == VStatus::kInvalidParameter);
+  CHECK(euler.getRotationOrder() == VTransformationMatrix::kXYZ);
+
+  // Relative changes: about the parent's axes, or the object's own ones.
+  VPxTransformationMatrix rel;
+  VQuaternion q1(0.4, VVector(0, 0, 1)), q2(0.7, VVector(1, 0, 0));
+  rel.rotateTo(q1);
+  rel.rotateBy(q2);
+  CHECK(rel.getRotation().isEquivalent(q1 * q2));
+  rel.rotateTo(q1);
+  rel.rotateBy(q2, VSpace::kPostTransform);
+  CHECK(rel.getRotation().isEquivalent(q2 * q1));
+  rel.translateBy(VVector(1, 0, 0), VSpace::kPostTransform);
+  CHECK(rel.getTranslation().isEquivalent(VVector(1, 0, 0) * (q2 * q1).asMatrix()));
+  rel.scaleTo(VVector(2, 3, 4));
+  rel.scaleBy(VVector(0.5, 2, 1));
+  rel.shearBy(VVector(0.1, 0, 0));
+  rel.shearBy(VVector(0.1, 0, 0));
+  CHECK(rel.getScale() == VVector(1, 6, 4) && rel.getShear().isEquivalent(VVector(0.2, 0, 0)));
+
+  // Refused: invalid spaces and the zero quaternion; nothing changes.
+  CHECK(rel.translateTo(VVector(9, 9, 9), VSpace::kInvalid) == VStatus::kInvalidParameter);
+  CHECK(rel.scaleTo(VVector(), VSpace::Space(VSpace::kLast)) == VStatus::kInvalidParameter);
+  CHECK(rel.rotateTo(VQuaternion(0, 0, 0, 0)) == VStatus::kInvalidParameter);
+  CHECK(rel.getScale() == VVector(1, 6, 4) && rel.getRotation().isEquivalent(q2 * q1));
+
+  VStatus status;
+  CHECK(VPxTransformationMatrix::convertEulerRotationOrder(VEulerRotation::kZYX, &status) ==
+            VTransformationMatrix::kZYX &&
+        status);
+  CHECK(VPxTransformationMatrix::convertTransformationRotationOrder(
+            VTransformationMatrix::kYZX, &status) == VEulerRotation::kYZX &&
+        status);
+  VPxTransformationMatrix::convertTransformationRotationOrder(VTransformationMatrix::kLast,
+                                                              &status);
+  CHECK(status == VStatus::kInvalidParameter);
+  delete static_cast<VPxTransformationMatrix *>(VPxTransformationMatrix::creator());
+}
+
+void testCommandResults() {
+  VStatus status;
+  VPxCommand::clearResult();
+  CHECK(VPxCommand::currentResultType() == VPxCommand::kNoArg);
+  CHECK(VPxCommand::currentIntResult(&status) == 0 && status == VStatus::kInvalidParameter);
+
+  VPxCommand::setResult(42);
+  CHECK(VPxCommand::currentResultType() == VPxCommand::kLong &&
+        !VPxCommand::isCurrentResultArray());
+  CHECK(VPxCommand::currentIntResult(&status) == 42 && status);
+  CHECK(VPxCommand::currentDoubleResult(&status) == 42.0 && status);
+  CHECK(VPxCommand::currentStringResult(&status) == "" && status == VStatus::kInvalidParameter);
+  VPxCommand::setResult(true);
+  CHECK(VPxCommand::currentIntResult() == 1);
+  VPxCommand::setResult(4000000000u);
+  CHECK(VPxCommand::currentDoubleResult(&status) == 4000000000.0 && status);
+  VPxCommand::setResult(VString("größe ✓"));
+  CHECK(VPxCommand::currentStringResult(&status) == "größe ✓" && status);
+  CHECK(VPxCommand::currentDoubleResult(&status) == 0.0 && status.error());
+
+  // Appending makes an array; another kind starts a new one.
+  VPxCommand::setResult(2.5);
+  VPxCommand::appendToResult(3.5);
+  VDoubleArray doubles;
+  CHECK(VPxCommand::isCurrentResultArray() && VPxCommand::getCurrentResult(doubles));
+  CHECK(doubles.length() == 2 && doubles[0] == 2.5 && doubles[1] == 3.5);
+  CHECK(VPxCommand::currentDoubleResult(&status) == 0.0 && status == VStatus::kInvalidParameter);
+  VPxCommand::appendToResult(VString("a"));
+  VPxCommand::appendToResult(VString("b"));
+  VStringArray strings;
+  CHECK(VPxCommand::getCurrentResult(strings) && strings.length() == 2 && strings[1] == "b");
+  CHECK(VPxCommand::getCurrentResult(doubles) == VStatus::kInvalidParameter &&
+        doubles.length() == 0);
+
+  VIntArray ints(3, 7);
+  ints[1] = -1;
+  VPxCommand::setResult(ints);
+  VIntArray back;
+  CHECK(VPxCommand::getCurrentResult(back) && back == ints);
+  CHECK(VPxCommand::getCurrentResult(doubles) && doubles.length() == 3 && doubles[1] == -1.0);
+  VPxCommand::setResult(VStringArray());
+  CHECK(VPxCommand::isCurrentResultArray() &&
+        VPxCommand::currentResultType() == VPxCommand::kString);
+  VPxCommand::clearResult();
+
+  Tlog::clear();
+  VPxCommand::displayWarning("careful");
+  VPxCommand::displayError("broken");
+  auto log = Tlog::entries();
+  CHECK(log.size() == 2 && log[0] == "Warning: careful" && log[1] == "Error: broken");
+
+  VPxCommand command;
+  CHECK(!command.isUndoable() && command.hasSyntax());
+  command.setUndoable(true);
+  command.setCommandString("doThing -v 1");
+  CHECK(command.isUndoable() && command.commandString() == "doThing -v 1");
+  CHECK(command.doIt(VArgList()) == VStatus::kNotImplemented);
+}
+
+void testArgumentsAndSyntax() {
+  VArgList args;
+  args.addArg("-v").addArg(3).addArg(2.5).addArg(true).addArg("42").addArg("On").addArg("x").addArg(
+      0.1);
+  CHECK(args.length() == 8);
+  VStatus status;
+  CHECK(args.asString(0, &status) == "-v" && status);
+  CHECK(args.asString(1) == "3" && args.asString(2) == "2.5" && args.asString(3) == "true");
+  CHECK(args.asString(7) == "0.1" &&
+        VArgList().addArg(0.1 + 0.2).asString(0) == "0.30000000000000004");
+  CHECK(args.asInt(4, &status) == 42 && status && args.asDouble(1) == 3.0);
+  CHECK(args.asInt(2, &status) == 0 && status == VStatus::kInvalidParameter);
+  CHECK(args.asBool(5, &status) && status && args.asBool(1));
+  CHECK(!args.asBool(6, &status) && status == VStatus::kInvalidParameter);
+  CHECK(args.asDouble(6, &status) == 0.0 && status.error());
+  CHECK(args.asString(8, &status) == "" && status == VStatus::kInvalidParameter);
+  VArgList big;
+  big.addArg(1.0e12).addArg("99999999999");
+  CHECK(big.asInt(0, &status) == 0 && status.error() && big.asInt(1, &status) == 0 &&
+        status.error());
+  CHECK(args.flagIndex("-x", "-v") == 0 && args.flagIndex("-q") == VArgList::kInvalidArgIndex);
+
+  VSyntax syntax;
+  CHECK(syntax.addFlag("-v", "-verbose") &&
+        syntax.addFlag("-n", "-name", VSyntax::kString, VSyntax::kLong));
+  CHECK(syntax.addFlag("-v", "-value") == VStatus::kInvalidParameter);
+  CHECK(syntax.addFlag("n", "-number") == VStatus::kInvalidParameter);
+  CHECK(syntax.numberOfFlags() == 2 && syntax.numberOfFlagArgs("-name") == 2);
+  CHECK(syntax.flagArgType("-n", 1) == VSyntax::kLong &&
+        syntax.flagArgType("-n", 2) == VSyntax::kInvalidArgType);
+  CHECK(syntax.setMinObjects(2) && syntax.setMaxObjects(1) == VStatus::kInvalidParameter);
+}
+
+void testPlugins() {
+  standin::unloadAllPlugins();
+  VObject object = standin::loadPlugin("rigTools", "/plug-ins/rig");
+  VStatus status;
+  VFnPlugin plugin(object, "Studio", "2.1", "Any", &status);
+  CHECK(status && plugin.object() == object);
+  CHECK(plugin.name() == "rigTools" && plugin.vendor() == "Studio" && plugin.version() == "2.1");
+  CHECK(plugin.loadPath() == "/plug-ins/rig" && plugin.apiVersion() == "Any");
+  VFnPlugin again(object);  // defaults do not overwrite what was recorded
+  CHECK(again.vendor() == "Studio" && again.setVersion("2.2") && plugin.version() == "2.2");
+
+  VObject null;
+  VFnPlugin detached(null, "X", "1", "Any", &status);
+  CHECK(status == VStatus::kInvalidParameter && detached.object().isNull());
+  CHECK(detached.setName("any") == VStatus::kFailure && detached.name() == "");
+
+  VObject other = standin::loadPlugin("meshTools", "/plug-ins/mesh");
+  VFnPlugin second(other);
+  status = second.setName("rigTools", false);
+  CHECK(status == VStatus::kFailure && second.name() == "meshTools");
+  CHECK(status.errorString() == "The plug-in name 'rigTools' is already in use");
+  CHECK(second.setName("rigTools") && second.name() == "rigTools1");
+  CHECK(second.setName("rigTools") && second.name() == "rigTools1");  // its own name is free to it
+  CHECK(VFnPlugin::findPlugin("rigTools1") == other && VFnPlugin::findPlugin("meshTools").isNull());
+  CHECK(plugin.setName("rigTools", false) && plugin.name() == "rigTools");
+  CHECK(standin::loadPlugin("rigTools", "") != object &&
+        VFnPlugin::findPlugin("rigTools2").apiType() == VFn::kPlugin);
+
+  VFnPlugin::setRegisteringCallableScript();
+  CHECK(VFnPlugin::registeringCallableScript() && !VFnPlugin::registeringCallableScript());
+  CHECK(!VFnPlugin::isNodeRegistered("rigNode"));
+  CHECK(VPxNode::inheritAttributesFrom("rigNode") == VStatus::kInvalidParameter);
+
+  VString box("openRigOptions");
+  VStringArray items = plugin.addMenuItem("rig", "mainMenu", "rigCommand", "", true, &box, &status);
+  CHECK(status && items.length() == 2 && items[0] == "rig" && items[1] == "rigOption");
+  items =
+      second.addMenuItem("rig", "Rig…", "mainMenu", "rigCommand", "-all", false, nullptr, &status);
+  CHECK(status && items.length() == 1 && items[0] == "rig1");
+  plugin.addMenuItem("bad", "mainMenu", "cmd", "", true, nullptr, &status);
+  CHECK(status == VStatus::kInvalidParameter);
+  VStringArray remove;
+  remove.append("rig");
+  remove.append("rig1");  // the other plug-in's
+  CHECK(plugin.removeMenuItem(remove) == VStatus::kInvalidParameter);
+  CHECK(second.removeMenuItem(remove) == VStatus::kInvalidParameter);
+  CHECK(plugin.addMenuItem("rig", "mainMenu", "c", "", false)[0] == "rig");
+
+  PyObject *procs = reinterpret_cast<PyObject *>(&status);  // never dereferenced
+  CHECK(plugin.registerUI(procs, nullptr) == VStatus::kInvalidParameter);
+  CHECK(plugin.registerUI(procs, procs) && plugin.registerUI(procs, procs) == VStatus::kFailure);
+  CHECK(plugin.registerDisplayFilter("rigs", "Rigs", "drawdb") &&
+        second.registerDisplayFilter("rigs", "Rigs", "") == VStatus::kInvalidParameter);
+  VPluginCallableInfo info("rigNode", "creator");
+  plugin.setCallableInfo(&info);
+  CHECK(again.getCallableInfo() == &info && second.getCallableInfo() == nullptr);
+
+  standin::unloadPlugin(object);
+  CHECK(plugin.name() == "" && plugin.setVersion("3") == VStatus::kFailure);
+  CHECK(VFnPlugin::findPlugin("rigTools").isNull());
+  standin::unloadAllPlugins();
+}
+
+void testNodesAndData() {
+  VPxNode node;
+  VPlug plug(standin::makeObject(VFn::kDependencyNode, "blend1"), standin::makeAttribute("weight"));
+  VDataBlock block;
+  CHECK(node.compute(plug, block) == VStatus::kUnknownParameter &&
+        node.internalArrayCount(plug, VDGContext()) == -1);
+  CHECK(node.thisVObject().isNull() && node.existWithoutInConnections() && !node.doNotWrite());
+  standin::setNodeIdentity(node, plug.node(), "blend", VTypeId(0x80001));
+  CHECK(node.name() == "blend1" && node.typeName() == "blend" && node.typeId() == VTypeId(0x80001));
+  CHECK(plug.name() == "blend1.weight" &&
+        plug.elementByLogicalIndex(3).name() == "blend1.weight[3]");
+
+  standin::beginNodeType();
+  VObject input = standin::makeAttribute("input"), output = standin::makeAttribute("output");
+  CHECK(VPxNode::addAttribute(input) && VPxNode::addAttribute(output));
+  CHECK(VPxNode::addAttribute(input) == VStatus::kInvalidParameter);
+  CHECK(VPxNode::addAttribute(plug.node()) == VStatus::kInvalidParameter);
+  CHECK(VPxNode::attributeAffects(VPlug(VObject(), input), VPlug(VObject(), output)));
+  CHECK(standin::nodeTypeAffects(input, output) && !standin::nodeTypeAffects(output, input));
+  CHECK(VPxNode::removeAttribute(input) && !standin::nodeTypeAffects(input, output));
+  CHECK(standin::nodeTypeAttributeCount() == 1 && VPxNode::removeAttribute(input).error());
+
+  // Handles share the block's value; a copy of the block shares it too.
+  VStatus status;
+  VDataHandle out = block.outputValue(output, &status);
+  CHECK(status && !out.isNull() && !block.isClean(output));
+  out.setDouble(2.75);
+  VDataBlock copy(block);
+  CHECK(copy.inputValue(output).asDouble() == 2.75 && copy.inputValue(output).asInt() == 2);
+  CHECK(block.setClean(output) && copy.isClean(output));
+  VPlug element = VPlug(VObject(), output).elementByLogicalIndex(1);
+  block.outputValue(element).setString("text");
+  CHECK(block.inputValue(element).asString() == "text" &&
+        block.inputValue(element).asDouble() == 0.0);
+  CHECK(block.inputValue(output).asDouble() == 2.75 && !block.isClean(element));
+  CHECK(block.inputValue(VObject(), &status).isNull() && status == VStatus::kInvalidParameter);
+}
+
+void testMatricesAndPoints() {
+  double values[4][4] = {{2, 1, 0, 0}, {0, 3, 1, 0}, {1, 0, 4, 0}, {5, -2, 7, 1}};
+  VMatrix m(values);
+  CHECK(std::fabs(m.det4x4() - 25.0) < 1e-12 && std::fabs(m.det3x3() - 25.0) < 1e-12);
+  CHECK((m * m.inverse()).isEquivalent(VMatrix()) && (m.inverse() * m).isEquivalent(VMatrix()));
+  CHECK(m.transpose()(3, 0) == 0.0 && m.transpose()(0, 3) == 5.0 && !m.isSingular());
+  double out[4][4];
+  m.get(out);
+  CHECK(out[3][2] == 7.0 && m.translation() == VVector(5, -2, 7));
+  // A pivoting row swap is needed: the leading entry is zero.
+  double swapped[4][4] = {{0, 1, 0, 0}, {1, 0, 0, 0}, {0, 0, 1, 0}, {0, 0, 0, 1}};
+  CHECK((VMatrix(swapped) * VMatrix(swapped).inverse()).isEquivalent(VMatrix()));
+  double flat[4][4] = {{1, 2, 3, 0}, {2, 4, 6, 0}, {0, 0, 1, 0}, {0, 0, 0, 1}};
+  CHECK(VMatrix(flat).isSingular() && VMatrix(flat).inverse() == VMatrix());
+
+  // Points carry translation, vectors do not; w scales the cartesian point.
+  CHECK((VPoint(1, 1, 1) * m).isEquivalent(VPoint(8, 2, 12)));
+  CHECK((VVector(1, 1, 1) * m).isEquivalent(VVector(3, 4, 5)));
+  VPoint h(2, 4, 6, 2);
+  CHECK(h.isEquivalent(VPoint(1, 2, 3)) && (h + VVector(1, 0, 0)).isEquivalent(VPoint(2, 2, 3)));
+  CHECK(h.cartesianize() && h == VPoint(1, 2, 3, 1));
+  VPoint infinite(1, 0, 0, 0);
+  CHECK(infinite.cartesianize() == VStatus::kInvalidParameter && infinite.w == 0.0);
+  CHECK(VPoint(4, 6, 3) - VPoint(1, 2, 3) == VVector(3, 4, 0) &&
+        VPoint().distanceTo(VPoint(3, 4)) == 5.0);
+  VVector zero;
+  CHECK(zero.normalize() == VStatus::kInvalidParameter &&
+        (VVector(1, 0, 0) ^ VVector(0, 1, 0)) == VVector(0, 0, 1));
+
+  // Interpolation keeps to the short arc and the axis.
+  VQuaternion quarter(M_PI / 2, VVector(0, 0, 1));
+  VQuaternion eighth = VQuaternion::slerp(VQuaternion(), -quarter, 0.5);
+  CHECK(eighth.isEquivalent(VQuaternion(M_PI / 4, VVector(0, 0, 1))));
+  VVector axis;
+  double angle = 0;
+  CHECK(VQuaternion(1.25, VVector(0, 3, 4)).getAxisAngle(axis, angle) &&
+        std::fabs(angle - 1.25) < 1e-12);
+  CHECK(axis.isEquivalent(VVector(0, 0.6, 0.8)) && !VQuaternion().getAxisAngle(axis, angle));
+
+  // Equal matrices from different components: equivalent but not equal.
+  VTransformationMatrix a, b;
+  a.setRotation(VQuaternion(0.5, VVector(0, 1, 0)));
+  b = a;
+  b.setRotatePivot(VPoint(1, 2, 3));
+  CHECK(a.isEquivalent(b) && a != b);
+  CHECK(VTransformationMatrix(VMatrix(flat)) == VTransformationMatrix());
+  a.setTranslation(VVector(4, 0, 0));
+  CHECK(a.asMatrix(0.5).isEquivalent(
+      VQuaternion(0.25, VVector(0, 1, 0)).asMatrix().setTranslation(VVector(2, 0, 0))));
+}
+
+void testTimesAndEvaluation() {
+  CHECK(VTime(48, VTime::kFilm) == VTime(2, VTime::kSeconds) &&
+        VTime(1, VTime::kMinutes) > VTime(59));
+  CHECK(std::fabs(VTime(1, VTime::kNTSCFrame).as(VTime::kMilliseconds) - 1000.0 / 30) < 1e-9);
+  CHECK(VTime(3, VTime::kInvalid).as(VTime::kSeconds) == 0.0);
+  VTimeRange range(VTime(1), VTime(25, VTime::kFilm));
+  CHECK(!range.isEmpty() && range.contains(VTime(24, VTime::kFilm)) && !range.contains(VTime(2)));
+  CHECK(VTimeRange().isEmpty() && VTimeRange(VTime(5), VTime(4)) == VTimeRange() &&
+        range != VTimeRange());
+  VPxNode node;
+  CHECK(node.transformInvalidationRange(VPlug(), range) == range);
+  CHECK(VDGContext().isNormal() && !VDGContext(VTime(2)).isNormal());
+  CHECK(VDGContext(VTime(48, VTime::kFilm)) == VDGContext(VTime(2)) &&
+        VDGContext() != VDGContext(VTime()));
+
+  VObject weights = standin::makeAttribute("weights");
+  VObject graphNode = standin::makeObject(VFn::kDependencyNode, "skin1");
+  VPlugArray dirty;
+  dirty.append(VPlug(graphNode, weights).elementByLogicalIndex(4));
+  CHECK(dirty.set(VPlug(), 1) == VStatus::kInvalidParameter && dirty.length() == 1);
+  VEvaluationNode evaluation(graphNode, dirty);
+  VStatus status;
+  CHECK(evaluation.dirtyPlugExists(weights) && !evaluation.dirtyPlugExists(VPxNode::state));
+  CHECK(evaluation.dependencyNode(&status) == graphNode && status);
+  CHECK(VEvaluationNode().dependencyNode(&status).isNull() && status == VStatus::kInvalidParameter);
+
+  VCacheSchema schema;
+  CHECK(schema.add(weights) && schema.add(weights) && schema.length() == 1);
+  CHECK(schema.add(graphNode) == VStatus::kInvalidParameter && schema.contains(weights));
+  VNodeCacheSetupInfo setup;
+  setup.setPreference(VNodeCacheSetupInfo::kWantToCacheByDefault, true);
+  setup.setPreference(VNodeCacheSetupInfo::kPreferenceLast, true);
+  CHECK(setup.getPreference(VNodeCacheSetupInfo::kWantToCacheByDefault) &&
+        !setup.getPreference(VNodeCacheSetupInfo::kPreferenceLast));
+}
+
+// The context forms of the internal-value queries reach the plain forms that
+// a node overrides.
+class CountingNode : public VPxNode {
+ public:
+  bool getInternalValue(const VPlug &, VDataHandle &handle) override {
+    handle.setInt(++calls);
+    return true;
+  }
+  int calls = 0;
+};
+
+void testNodeOverrides() {
+  CountingNode node;
+  VDataBlock block;
+  VObject attribute = standin::makeAttribute("count");
+  VDataHandle handle = block.outputValue(attribute);
+  VDGContext context(VTime(3));
+  VPxNode &base = node;
+  CHECK(base.getInternalValueInContext(VPlug(), handle, context) && node.calls == 1);
+  CHECK(block.inputValue(attribute).asInt() == 1);
+  CHECK(!base.setInternalValueInContext(VPlug(), handle, context));
+
+  VObject notPlugin = standin::makeObject(VFn::kDependencyNode, "plain");
+  VStatus status;
+  VFnPlugin plugin(notPlugin, "V", "1", "Any", &status);
+  CHECK(status == VStatus::kInvalidParameter && plugin.object().isNull() && plugin.vendor() == "");
+
+  VPxTransformationMatrix moved;
+  moved.translateTo(VVector(1, 2, 3));
+  VPxTransformationMatrix assigned;
+  assigned = moved;
+  CHECK(assigned.getTranslation() == VVector(1, 2, 3));
+  CHECK(VPxTransformationMatrix::identity.asMatrix() == VMatrix());
+}
+
 }  // namespace
 
 int main() {
@@ -287,6 +783,15 @@ int main() {
   testStrings();
   testObjectsAndStatics();
   testLifetimes();
+  testRotations();
+  testTransformationMatrix();
+  testCommandResults();
+  testArgumentsAndSyntax();
+  testPlugins();
+  testNodesAndData();
+  testMatricesAndPoints();
+  testTimesAndEvaluation();
+  testNodeOverrides();
 
   Py_InitializeEx(0);
   PyThreadState *mainThread = PyEval_SaveThread();

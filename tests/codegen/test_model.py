@@ -35,8 +35,11 @@ def test_descriptors_sorted_by_bytes_with_manifest_types(fixture):
     names = [d.name for d in fixture.descriptors]
     assert names == sorted(names, key=str.encode)
     assert [d.index for d in fixture.descriptors] == list(range(len(names)))
+    # Pointer parameters bring _p_VStatus, _p_VString and _p_char; strings and
+    # string arrays passed by value or reference bring none.
     assert names == ['_p_Abstract', '_p_Helper', '_p_Hidden', '_p_Mesh', '_p_Node', '_p_Pair',
-                     '_p_Root', '_p_Shape', '_p_Value', '_p_int', '_p_intPtr']
+                     '_p_Root', '_p_Shape', '_p_VStatus', '_p_VString', '_p_Value', '_p_char',
+                     '_p_int', '_p_intPtr']
     assert {d.name: d.readable for d in fixture.descriptors}['_p_Value'] == 'Value *'
 
 
@@ -55,7 +58,7 @@ def test_cast_lists_hold_every_descendant(fixture):
 def test_manifest_may_not_repeat_a_derived_type(tmp_path):
     text = open(os.path.join(FIXTURES, 'fixture.toml')).read() + ''
     text = text.replace('[types]\n', '[types]\n_p_Node = "Node *"\n')
-    with pytest.raises(model_mod.GeneratorError, match='_p_Node is derived from the headers'):
+    with pytest.raises(model_mod.GeneratorError, match='the headers derive these types; remove them from the manifest: _p_Node'):
         build(text, open(os.path.join(INCLUDE, 'sdk', 'Base.h')).read(), tmp_path)
 
 
@@ -105,7 +108,7 @@ def test_overloaded_constructor_dispatch_and_message(fixture):
 def test_overlapping_counts_test_the_first_differing_argument(tmp_path):
     header = '''namespace S {
 class A {}; class B {};
-class R { public: R(A &a, int *p = 0); R(B &b); virtual ~R(); };
+class R { public: R(A &a, int **p = 0); R(B &b); virtual ~R(); };
 }'''
     text = '''[module]
 name = "_M"
@@ -113,9 +116,9 @@ proxy = "M"
 namespace = "S"
 classes = [ { name = "R", family = "f", header = "sdk/Base.h" } ]
 '''
-    with pytest.raises(model_mod.GeneratorError, match='has no conversion yet'):
+    with pytest.raises(model_mod.GeneratorError, match='has no conversion'):
         build(text, header, tmp_path)
-    header = header.replace('int *p = 0', 'A *p = 0')
+    header = header.replace('int **p = 0', 'A *p = 0')
     rules = {c.name: c.constructor for c in build(text, header, tmp_path).classes}['R'].dispatch
     assert [r.counts for r in rules] == [(2, 2), (3, 3)]
     assert [c.function for c in rules[0].candidates] == ['wrap_new_R_1', 'wrap_new_R_2']
@@ -125,8 +128,13 @@ classes = [ { name = "R", family = "f", header = "sdk/Base.h" } ]
 def test_method_table_order_and_flags(fixture):
     rows = [(e.name, e.flags) for e in fixture.entries]
     assert rows[:2] == [('SWIG_PyInstanceMethod_New', METH_O), ('SWIG_PyStaticMethod_New', METH_O)]
-    assert rows[2:7] == [('new_Node', METH_O), ('delete_Node', METH_O), ('disown_Node', METH_O),
-                         ('Node_swigregister', METH_O), ('Node_swiginit', METH_VARARGS)]
+    # Members sit between destruction and the hand-over to the host.
+    assert rows[2:14] == [('new_Node', METH_O), ('delete_Node', METH_O), ('Node_count', METH_O),
+                          ('Node_setCount', METH_VARARGS), ('Node_make', METH_VARARGS),
+                          ('Node_parent', METH_O), ('Node_value', METH_O),
+                          ('Node_rename', METH_VARARGS), ('Node_names', METH_VARARGS),
+                          ('Node_pick', METH_VARARGS), ('disown_Node', METH_O),
+                          ('Node_swigregister', METH_O)]
     # No director: no disown entry.
     assert rows[-4:] == [('new_Value', METH_NOARGS), ('delete_Value', METH_O),
                          ('Value_swigregister', METH_O), ('Value_swiginit', METH_VARARGS)]
@@ -161,3 +169,54 @@ def test_spelling_and_mangling(t, spelled, mangled):
     assert spell(t) == spelled
     if mangled:
         assert pointer_descriptor_name(t.inner)[0] == mangled
+
+
+def members(fixture, cls='Node'):
+    return {m.member: m for m in next(c for c in fixture.classes if c.name == cls).members}
+
+
+def test_member_arguments_and_their_messages(fixture):
+    m = members(fixture)
+    (count,) = m['count'].candidates
+    assert count.args[0].is_self and count.args[0].spelling == 'Node const *'
+    assert count.args[0].null_message == ("invalid null reference in method 'Node_count', "
+                                          "argument 1 of type 'Node const *'")
+    assert count.result.kind == 'scalar' and count.prototype == 'Node::count() const'
+    (set_count,) = m['setCount'].candidates
+    n, notify = set_count.args[1:]
+    assert n.message == "in method 'Node_setCount', argument 2 of type 'unsigned int'"
+    assert (notify.converter, notify.default) == ('AsBool', 'true')
+    assert (set_count.min_args, set_count.max_args) == (2, 3)
+    # A static member: no self, its first argument is argument 1; an
+    # enumerator default is qualified so that it compiles outside the class.
+    (make,) = m['make'].candidates
+    assert make.static and make.args[0].kind == 'chars'
+    assert make.args[0].message == "in method 'Node_make', argument 1 of type 'char const *'"
+    assert (make.args[1].cast, make.args[1].default) == ('Node::Kind', 'Node::kPlain')
+    assert make.result.kind == 'value' and make.result.descriptor.name == '_p_Value'
+
+
+def test_strings_lists_and_status(fixture):
+    m = members(fixture)
+    (rename,) = m['rename'].candidates
+    name, aliases = rename.args[1:]
+    assert (name.kind, name.message) == ('string', 'Expected a String or Unicode object for argument 2')
+    assert aliases.kind == 'string_array' and aliases.output
+    assert aliases.list_messages == ('Argument 3 must be a list object',
+                                     'Unable to modify argument 3 to return results')
+    assert rename.result.kind == 'status'
+    # The status output is the wrapper's own: it keeps its number but takes no
+    # Python argument.
+    (names,) = m['names'].candidates
+    prefix, status = names.args[1:]
+    assert (prefix.kind, prefix.optional, prefix.slot) == ('string_ptr', True, 1)
+    assert (status.kind, status.number, status.slot) == ('status_out', 3, None)
+    assert (names.min_args, names.max_args) == (1, 2)
+    assert names.prototype == 'Node::names(VString const *,VStatus *) const'
+
+
+def test_member_overloads_test_the_differing_argument(fixture):
+    pick = members(fixture)['pick']
+    assert pick.flags == METH_VARARGS
+    assert [r.counts for r in pick.dispatch] == [(2, 2), (3, 3)]
+    assert pick.message.endswith('    Node::pick(int)\n    Node::pick(Value const &,int)\n')

@@ -29,7 +29,7 @@ VPxHardwareShader VPxManipulatorNode VPxEmitterNode VPxFieldNode VPxFluidEmitter
 VPxSpringNode VPxParticleAttributeMapperNode VPxRenderPassImpl""".split()
 NO_DIRECTOR = {'VFnPlugin', 'VExternalContentInfoTable', 'VExternalContentLocationTable',
                'VPxVorlaAsciiFilterOutput', 'MaterialInputData'}
-NEW_FLAGS = {'VPxMaterialInformation': METH_VARARGS}
+NEW_FLAGS = {'VPxMaterialInformation': METH_VARARGS, 'VFnPlugin': METH_VARARGS}
 
 
 class PyMethodDef(ctypes.Structure):
@@ -53,16 +53,36 @@ def builtins(module):
             if type(v).__name__ == 'builtin_function_or_method']
 
 
+POINTER_CLASSES = ['charPtr', 'intPtr', 'shortPtr', 'floatPtr', 'doublePtr', 'boolPtr', 'uIntPtr',
+                   'uCharPtr']
+
+
 def test_method_table_entries_in_order_with_their_flags():
-    expected = [('SWIG_PyInstanceMethod_New', METH_O), ('SWIG_PyStaticMethod_New', METH_O)]
+    table = [(k, method_flags(v)) for k, v in builtins(ext)]
+    assert all(v.__doc__ is None for _, v in builtins(ext))
+    assert table[:2] == [('SWIG_PyInstanceMethod_New', METH_O), ('SWIG_PyStaticMethod_New', METH_O)]
+    expected = []
+    for p in POINTER_CLASSES:
+        expected += [(f'new_{p}', METH_VARARGS), (f'delete_{p}', METH_O),
+                     (f'{p}_assign', METH_VARARGS), (f'{p}_value', METH_O), (f'{p}_cast', METH_O),
+                     (f'{p}_frompointer', METH_O), (f'{p}_swigregister', METH_O),
+                     (f'{p}_swiginit', METH_VARARGS)]
+    assert table[2:2 + len(expected)] == expected
+    rest = table[2 + len(expected):]
+    # Per class: construction and destruction, its members, then the hand-over
+    # to the host (director classes only) and registration.
     for c in CLASSES:
         flags = NEW_FLAGS.get(c, METH_NOARGS if c in NO_DIRECTOR else METH_O)
-        expected += [(f'new_{c}', flags), (f'delete_{c}', METH_O)]
-        if c not in NO_DIRECTOR:
-            expected.append((f'disown_{c}', METH_O))
-        expected += [(f'{c}_swigregister', METH_O), (f'{c}_swiginit', METH_VARARGS)]
-    assert [(k, method_flags(v)) for k, v in builtins(ext)] == expected
-    assert all(v.__doc__ is None for _, v in builtins(ext))
+        assert rest[:2] == [(f'new_{c}', flags), (f'delete_{c}', METH_O)]
+        rest = rest[2:]
+        while rest and rest[0][0].startswith(c + '_') and not rest[0][0].endswith('_swigregister'):
+            rest = rest[1:]
+        tail = ([(f'disown_{c}', METH_O)] if c not in NO_DIRECTOR else []) + [
+            (f'{c}_swigregister', METH_O), (f'{c}_swiginit', METH_VARARGS)]
+        assert rest[:len(tail)] == tail
+        rest = rest[len(tail):]
+    assert rest == []
+    assert table[-1] == ('VPxRenderPassImpl_swiginit', METH_VARARGS)
 
 
 def test_dictionary_in_installation_order():

@@ -18,6 +18,7 @@ public:
 
 protected:
   VFnBase();
+  explicit VFnBase(const VObject &object);  // attached to the object
 
 private:
   VObject fObject;

@@ -2,7 +2,7 @@
 #pragma once
 
 #include <openvorla/VApiVersion.h>
-#include <openvorla/VTypes.h>
+#include <openvorla/VTime.h>
 
 OPENVORLA_NAMESPACE_OPEN
 

@@ -4,7 +4,7 @@
 #include <openvorla/MaterialInputData.h>
 #include <openvorla/VApiVersion.h>
 #include <openvorla/VObject.h>
-#include <openvorla/VTypes.h>
+#include <openvorla/VPlug.h>
 
 OPENVORLA_NAMESPACE_OPEN
 

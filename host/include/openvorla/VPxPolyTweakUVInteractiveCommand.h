@@ -2,9 +2,9 @@
 #pragma once
 
 #include <openvorla/VApiVersion.h>
+#include <openvorla/VArgList.h>
 #include <openvorla/VPxToolCommand.h>
 #include <openvorla/VStatus.h>
-#include <openvorla/VTypes.h>
 
 OPENVORLA_NAMESPACE_OPEN
 

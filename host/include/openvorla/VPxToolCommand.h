@@ -2,9 +2,9 @@
 #pragma once
 
 #include <openvorla/VApiVersion.h>
+#include <openvorla/VArgList.h>
 #include <openvorla/VPxCommand.h>
 #include <openvorla/VStatus.h>
-#include <openvorla/VTypes.h>
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -13,7 +13,7 @@ public:
   VPxToolCommand();
   ~VPxToolCommand() override;
 
-  virtual VStatus doIt(const VArgList &args) = 0;
+  VStatus doIt(const VArgList &args) override = 0;
 };
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -7,6 +7,11 @@ import weakref
 from . import _Fixture as _ext
 from . import Other
 
+# Members are the module's built-ins themselves, bound as methods: a call
+# reaches the entry point without a Python frame in between.
+_instance_method = _ext.SWIG_PyInstanceMethod_New
+_static_method = _ext.SWIG_PyStaticMethod_New
+
 
 def _thisown_get(self):
     return self.this.own()
@@ -25,7 +30,6 @@ def _proxy_repr(self):
 
 
 cvar = _ext.cvar
-
 SDK_MAKER = _ext.SDK_MAKER
 
 class Node(object):
@@ -37,6 +41,15 @@ class Node(object):
         _ext.Node_swiginit(self, _ext.new_Node(_self, *args))
 
     __swig_destroy__ = _ext.delete_Node
+
+    count = _instance_method(_ext.Node_count)
+    setCount = _instance_method(_ext.Node_setCount)
+    make = _static_method(_ext.Node_make)
+    parent = _instance_method(_ext.Node_parent)
+    value = _instance_method(_ext.Node_value)
+    rename = _instance_method(_ext.Node_rename)
+    names = _instance_method(_ext.Node_names)
+    pick = _instance_method(_ext.Node_pick)
 
     def __disown__(self):
         self.this.disown()
@@ -96,6 +109,8 @@ class Abstract(object):
         _ext.Abstract_swiginit(self, _ext.new_Abstract(_self, *args))
 
     __swig_destroy__ = _ext.delete_Abstract
+
+    name = _instance_method(_ext.Abstract_name)
 
     def __disown__(self):
         self.this.disown()

@@ -7,6 +7,7 @@
 #include "args.h"
 #include "dispatch.h"
 #include "scalars.h"
+#include "text.h"
 
 #include <sdk/Base.h>
 #include <sdk/Base.h>
@@ -20,7 +21,7 @@ using namespace Acme::Sdk;
 
 namespace Fixture_wrap {
 
-extern swig_type_info *swig_types[12];
+extern swig_type_info *swig_types[15];
 extern swig_module_info swig_module;
 extern PyMethodDef module_methods[];
 extern PyMethodDef proxydoc_methods[];
@@ -33,12 +34,23 @@ extern PyMethodDef proxydoc_methods[];
 #define SWIGTYPE_p_Pair swig_types[5]
 #define SWIGTYPE_p_Root swig_types[6]
 #define SWIGTYPE_p_Shape swig_types[7]
-#define SWIGTYPE_p_Value swig_types[8]
-#define SWIGTYPE_p_int swig_types[9]
-#define SWIGTYPE_p_intPtr swig_types[10]
+#define SWIGTYPE_p_VStatus swig_types[8]
+#define SWIGTYPE_p_VString swig_types[9]
+#define SWIGTYPE_p_Value swig_types[10]
+#define SWIGTYPE_p_char swig_types[11]
+#define SWIGTYPE_p_int swig_types[12]
+#define SWIGTYPE_p_intPtr swig_types[13]
 
 PyObject *wrap_new_Node(PyObject *self, PyObject *args);
 PyObject *wrap_delete_Node(PyObject *self, PyObject *args);
+PyObject *wrap_Node_count(PyObject *self, PyObject *args);
+PyObject *wrap_Node_setCount(PyObject *self, PyObject *args);
+PyObject *wrap_Node_make(PyObject *self, PyObject *args);
+PyObject *wrap_Node_parent(PyObject *self, PyObject *args);
+PyObject *wrap_Node_value(PyObject *self, PyObject *args);
+PyObject *wrap_Node_rename(PyObject *self, PyObject *args);
+PyObject *wrap_Node_names(PyObject *self, PyObject *args);
+PyObject *wrap_Node_pick(PyObject *self, PyObject *args);
 PyObject *wrap_disown_Node(PyObject *self, PyObject *args);
 PyObject *wrap_Node_swigregister(PyObject *self, PyObject *args);
 PyObject *wrap_new_Shape(PyObject *self, PyObject *args);
@@ -51,6 +63,7 @@ PyObject *wrap_disown_Mesh(PyObject *self, PyObject *args);
 PyObject *wrap_Mesh_swigregister(PyObject *self, PyObject *args);
 PyObject *wrap_new_Abstract(PyObject *self, PyObject *args);
 PyObject *wrap_delete_Abstract(PyObject *self, PyObject *args);
+PyObject *wrap_Abstract_name(PyObject *self, PyObject *args);
 PyObject *wrap_disown_Abstract(PyObject *self, PyObject *args);
 PyObject *wrap_Abstract_swigregister(PyObject *self, PyObject *args);
 PyObject *wrap_new_Hidden(PyObject *self, PyObject *args);

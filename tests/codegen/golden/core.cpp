@@ -8,8 +8,8 @@ namespace Fixture_wrap {
 
 PyObject *wrap_new_Node(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
-  Node *result = new Node();
-  return swigrt::NewPointerObj(nullptr, result, SWIGTYPE_p_Node, SWIG_POINTER_NEW);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Node(), SWIGTYPE_p_Node, SWIG_POINTER_NEW);
+  return resultobj;
 }
 
 PyObject *wrap_delete_Node(PyObject *, PyObject *arg) {
@@ -18,6 +18,138 @@ PyObject *wrap_delete_Node(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Node, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Node', argument 1 of type 'Node *'")) return nullptr;
   delete static_cast<Node *>(argp1);
   Py_RETURN_NONE;
+}
+
+PyObject *wrap_Node_count(PyObject *, PyObject *arg) {
+  if (!arg) return nullptr;
+  PyObject *argv[1] = {arg};
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_count', argument 1 of type 'Node const *'", "invalid null reference in method 'Node_count', argument 1 of type 'Node const *'")) return nullptr;
+  PyObject *resultobj = PyLong_FromLong(static_cast<long>(static_cast<Node *>(argp1)->count()));
+  if (!resultobj) return nullptr;
+  return resultobj;
+}
+
+PyObject *wrap_Node_setCount(PyObject *, PyObject *args) {
+  PyObject *argv[3] = {};
+  if (!swigrt::UnpackTuple(args, "Node_setCount", 2, 3, argv)) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_setCount', argument 1 of type 'Node *'", "invalid null reference in method 'Node_setCount', argument 1 of type 'Node *'")) return nullptr;
+  unsigned int arg2;
+  if (!swigrt::ScalarArg(swigrt::AsUnsignedInt(argv[1], &arg2), "in method 'Node_setCount', argument 2 of type 'unsigned int'")) return nullptr;
+  bool arg3 = true;
+  if (argv[2] && !swigrt::ScalarArg(swigrt::AsBool(argv[2], &arg3), "in method 'Node_setCount', argument 3 of type 'bool'")) return nullptr;
+  static_cast<Node *>(argp1)->setCount(arg2, arg3);
+  PyObject *resultobj = Py_NewRef(Py_None);
+  return resultobj;
+}
+
+PyObject *wrap_Node_make(PyObject *, PyObject *args) {
+  PyObject *argv[2] = {};
+  if (!swigrt::UnpackTuple(args, "Node_make", 1, 2, argv)) return nullptr;
+  swigrt::CharsArg arg1;
+  if (!swigrt::ScalarArg(swigrt::AsCharPtr(argv[0], &arg1), "in method 'Node_make', argument 1 of type 'char const *'")) return nullptr;
+  int arg2 = Node::kPlain;
+  if (argv[1] && !swigrt::ScalarArg(swigrt::AsInt(argv[1], &arg2), "in method 'Node_make', argument 2 of type 'Node::Kind'")) return nullptr;
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Value(Node::make(arg1.ptr, static_cast<Node::Kind>(arg2))), SWIGTYPE_p_Value, SWIG_POINTER_OWN);
+  if (!resultobj) return nullptr;
+  return resultobj;
+}
+
+PyObject *wrap_Node_parent(PyObject *, PyObject *arg) {
+  if (!arg) return nullptr;
+  PyObject *argv[1] = {arg};
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_parent', argument 1 of type 'Node *'", "invalid null reference in method 'Node_parent', argument 1 of type 'Node *'")) return nullptr;
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Node *>(static_cast<Node *>(argp1)->parent()), SWIGTYPE_p_Node, 0);
+  if (!resultobj) return nullptr;
+  return resultobj;
+}
+
+PyObject *wrap_Node_value(PyObject *, PyObject *arg) {
+  if (!arg) return nullptr;
+  PyObject *argv[1] = {arg};
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_value', argument 1 of type 'Node const *'", "invalid null reference in method 'Node_value', argument 1 of type 'Node const *'")) return nullptr;
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Value *>(&static_cast<Node *>(argp1)->value()), SWIGTYPE_p_Value, 0);
+  if (!resultobj) return nullptr;
+  return resultobj;
+}
+
+PyObject *wrap_Node_rename(PyObject *, PyObject *args) {
+  PyObject *argv[3] = {};
+  if (!swigrt::UnpackTuple(args, "Node_rename", 3, 3, argv)) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_rename', argument 1 of type 'Node *'", "invalid null reference in method 'Node_rename', argument 1 of type 'Node *'")) return nullptr;
+  VString arg2;
+  swigrt::StringArg(argv[1], arg2, "Expected a String or Unicode object for argument 2");
+  VStringArray arg3;
+  swigrt::StringArrayArg(argv[2], arg3, "Expected a list of Strings or Unicode objects for argument 3");
+  VStatus result = static_cast<Node *>(argp1)->rename(arg2, arg3);
+  PyObject *resultobj = swigrt::StatusResult(result);
+  if (!resultobj) return nullptr;
+  if (!swigrt::UpdateOutputList(argv[2], arg3, "Argument 3 must be a list object",
+                                "Unable to modify argument 3 to return results")) {
+    Py_DECREF(resultobj);
+    return nullptr;
+  }
+  return resultobj;
+}
+
+PyObject *wrap_Node_names(PyObject *, PyObject *args) {
+  PyObject *argv[2] = {};
+  if (!swigrt::UnpackTuple(args, "Node_names", 1, 2, argv)) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_names', argument 1 of type 'Node const *'", "invalid null reference in method 'Node_names', argument 1 of type 'Node const *'")) return nullptr;
+  VString arg2;
+  const bool has2 = argv[1] && argv[1] != Py_None;
+  if (has2) swigrt::StringArg(argv[1], arg2, "Expected a String or Unicode object for argument 2");
+  VStatus status3;
+  PyObject *resultobj = swigrt::FromStringArray(static_cast<Node *>(argp1)->names(has2 ? &arg2 : nullptr, &status3));
+  if (!resultobj) return nullptr;
+  if (!swigrt::StatusSucceeded(status3)) {
+    Py_DECREF(resultobj);
+    return nullptr;
+  }
+  return resultobj;
+}
+
+static PyObject *wrap_Node_pick_1(Py_ssize_t argc, PyObject **argv) {
+  if (argc != 2) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_pick', argument 1 of type 'Node *'", "invalid null reference in method 'Node_pick', argument 1 of type 'Node *'")) return nullptr;
+  int arg2;
+  if (!swigrt::ScalarArg(swigrt::AsInt(argv[1], &arg2), "in method 'Node_pick', argument 2 of type 'int'")) return nullptr;
+  PyObject *resultobj = PyBool_FromLong(static_cast<Node *>(argp1)->pick(arg2));
+  if (!resultobj) return nullptr;
+  return resultobj;
+}
+
+static PyObject *wrap_Node_pick_2(Py_ssize_t argc, PyObject **argv) {
+  if (argc != 3) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_pick', argument 1 of type 'Node *'", "invalid null reference in method 'Node_pick', argument 1 of type 'Node *'")) return nullptr;
+  void *argp2 = nullptr;
+  if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Value, &argp2, "in method 'Node_pick', argument 2 of type 'Value const &'", "invalid null reference in method 'Node_pick', argument 2 of type 'Value const &'")) return nullptr;
+  int arg3;
+  if (!swigrt::ScalarArg(swigrt::AsInt(argv[2], &arg3), "in method 'Node_pick', argument 3 of type 'int'")) return nullptr;
+  PyObject *resultobj = PyBool_FromLong(static_cast<Node *>(argp1)->pick(*static_cast<Value *>(argp2), arg3));
+  if (!resultobj) return nullptr;
+  return resultobj;
+}
+
+PyObject *wrap_Node_pick(PyObject *, PyObject *args) {
+  PyObject *argv[3] = {};
+  Py_ssize_t argc = swigrt::UnpackTuple(args, "Node_pick", 0, 3, argv) - 1;
+  PyObject *result = nullptr;
+  if (argc == 2) {
+    result = wrap_Node_pick_1(argc, argv);
+  } else if (argc == 3) {
+    result = wrap_Node_pick_2(argc, argv);
+  }
+  if (!swigrt::DispatchFailed(result)) return result;
+  swigrt::RaiseOrModifyTypeError("Wrong number or type of arguments for overloaded function 'Node_pick'.\n  Possible C/C++ prototypes are:\n    Node::pick(int)\n    Node::pick(Value const &,int)\n");
+  return nullptr;
 }
 
 PyObject *wrap_disown_Node(PyObject *, PyObject *arg) {
@@ -35,8 +167,8 @@ PyObject *wrap_Node_swigregister(PyObject *, PyObject *args) {
 
 PyObject *wrap_new_Shape(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
-  Shape *result = new Shape();
-  return swigrt::NewPointerObj(nullptr, result, SWIGTYPE_p_Shape, SWIG_POINTER_NEW);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Shape(), SWIGTYPE_p_Shape, SWIG_POINTER_NEW);
+  return resultobj;
 }
 
 PyObject *wrap_delete_Shape(PyObject *, PyObject *arg) {
@@ -72,6 +204,16 @@ PyObject *wrap_delete_Abstract(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Abstract, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Abstract', argument 1 of type 'Abstract *'")) return nullptr;
   delete static_cast<Abstract *>(argp1);
   Py_RETURN_NONE;
+}
+
+PyObject *wrap_Abstract_name(PyObject *, PyObject *arg) {
+  if (!arg) return nullptr;
+  PyObject *argv[1] = {arg};
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Abstract, &argp1, "in method 'Abstract_name', argument 1 of type 'Abstract const *'", "invalid null reference in method 'Abstract_name', argument 1 of type 'Abstract const *'")) return nullptr;
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Value(static_cast<Abstract *>(argp1)->name()), SWIGTYPE_p_Value, SWIG_POINTER_OWN);
+  if (!resultobj) return nullptr;
+  return resultobj;
 }
 
 PyObject *wrap_disown_Abstract(PyObject *, PyObject *arg) {
@@ -118,8 +260,8 @@ static PyObject *wrap_new_Pair_1(Py_ssize_t argc, PyObject **argv) {
   if (argc != 2) return nullptr;
   void *argp2 = nullptr;
   if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Value, &argp2, "in method 'new_Pair', argument 2 of type 'Value &'", "invalid null reference in method 'new_Pair', argument 2 of type 'Value &'")) return nullptr;
-  Pair *result = new Pair(*static_cast<Value *>(argp2));
-  return swigrt::NewPointerObj(nullptr, result, SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(*static_cast<Value *>(argp2)), SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  return resultobj;
 }
 
 static PyObject *wrap_new_Pair_2(Py_ssize_t argc, PyObject **argv) {
@@ -128,8 +270,8 @@ static PyObject *wrap_new_Pair_2(Py_ssize_t argc, PyObject **argv) {
   if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Value, &argp2, "in method 'new_Pair', argument 2 of type 'Value &'", "invalid null reference in method 'new_Pair', argument 2 of type 'Value &'")) return nullptr;
   void *argp3 = nullptr;
   if (!swigrt::ReferenceArg(argv[2], SWIGTYPE_p_Node, &argp3, "in method 'new_Pair', argument 3 of type 'Node const &'", "invalid null reference in method 'new_Pair', argument 3 of type 'Node const &'")) return nullptr;
-  Pair *result = new Pair(*static_cast<Value *>(argp2), *static_cast<Node *>(argp3));
-  return swigrt::NewPointerObj(nullptr, result, SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(*static_cast<Value *>(argp2), *static_cast<Node *>(argp3)), SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  return resultobj;
 }
 
 static PyObject *wrap_new_Pair_3(Py_ssize_t argc, PyObject **argv) {
@@ -140,8 +282,8 @@ static PyObject *wrap_new_Pair_3(Py_ssize_t argc, PyObject **argv) {
   if (!swigrt::ReferenceArg(argv[2], SWIGTYPE_p_Value, &argp3, "in method 'new_Pair', argument 3 of type 'Value &'", "invalid null reference in method 'new_Pair', argument 3 of type 'Value &'")) return nullptr;
   void *argp4 = nullptr;
   if (!swigrt::ReferenceArg(argv[3], SWIGTYPE_p_Value, &argp4, "in method 'new_Pair', argument 4 of type 'Value &'", "invalid null reference in method 'new_Pair', argument 4 of type 'Value &'")) return nullptr;
-  Pair *result = new Pair(static_cast<Node *>(argp2), *static_cast<Value *>(argp3), *static_cast<Value *>(argp4));
-  return swigrt::NewPointerObj(nullptr, result, SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(static_cast<Node *>(argp2), *static_cast<Value *>(argp3), *static_cast<Value *>(argp4)), SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  return resultobj;
 }
 
 PyObject *wrap_new_Pair(PyObject *, PyObject *args) {
@@ -182,8 +324,8 @@ PyObject *wrap_Pair_swigregister(PyObject *, PyObject *args) {
 // Value
 
 PyObject *wrap_new_Value(PyObject *, PyObject *) {
-  Value *result = new Value();
-  return swigrt::NewPointerObj(nullptr, result, SWIGTYPE_p_Value, SWIG_POINTER_NEW);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Value(), SWIGTYPE_p_Value, SWIG_POINTER_NEW);
+  return resultobj;
 }
 
 PyObject *wrap_delete_Value(PyObject *, PyObject *arg) {

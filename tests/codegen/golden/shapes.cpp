@@ -8,8 +8,8 @@ namespace Fixture_wrap {
 
 PyObject *wrap_new_Mesh(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
-  Mesh *result = new Mesh();
-  return swigrt::NewPointerObj(nullptr, result, SWIGTYPE_p_Mesh, SWIG_POINTER_NEW);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Mesh(), SWIGTYPE_p_Mesh, SWIG_POINTER_NEW);
+  return resultobj;
 }
 
 PyObject *wrap_delete_Mesh(PyObject *, PyObject *arg) {

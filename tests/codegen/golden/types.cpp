@@ -22,7 +22,10 @@ swig_type_info type_p_Node = {"_p_Node", "Node *", nullptr, nullptr, nullptr, 0}
 swig_type_info type_p_Pair = {"_p_Pair", "Pair *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_Root = {"_p_Root", "Root *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_Shape = {"_p_Shape", "Shape *", nullptr, nullptr, nullptr, 0};
+swig_type_info type_p_VStatus = {"_p_VStatus", "VStatus *", nullptr, nullptr, nullptr, 0};
+swig_type_info type_p_VString = {"_p_VString", "VString *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_Value = {"_p_Value", "Value *", nullptr, nullptr, nullptr, 0};
+swig_type_info type_p_char = {"_p_char", "char *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_int = {"_p_int", "int *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_intPtr = {"_p_intPtr", "intPtr *", nullptr, nullptr, nullptr, 0};
 
@@ -34,7 +37,10 @@ swig_cast_info casts_p_Node[] = {{&type_p_Node, nullptr, nullptr, nullptr}, {&ty
 swig_cast_info casts_p_Pair[] = {{&type_p_Pair, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_Root[] = {{&type_p_Root, nullptr, nullptr, nullptr}, {&type_p_Helper, cast_p_HelperTo_p_Root, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_Shape[] = {{&type_p_Shape, nullptr, nullptr, nullptr}, {&type_p_Mesh, cast_p_MeshTo_p_Shape, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
+swig_cast_info casts_p_VStatus[] = {{&type_p_VStatus, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
+swig_cast_info casts_p_VString[] = {{&type_p_VString, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_Value[] = {{&type_p_Value, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
+swig_cast_info casts_p_char[] = {{&type_p_char, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_int[] = {{&type_p_int, nullptr, nullptr, nullptr}, {&type_p_intPtr, cast_p_intPtrTo_p_int, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_intPtr[] = {{&type_p_intPtr, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 
@@ -47,7 +53,10 @@ swig_type_info *type_initial[] = {
     &type_p_Pair,
     &type_p_Root,
     &type_p_Shape,
+    &type_p_VStatus,
+    &type_p_VString,
     &type_p_Value,
+    &type_p_char,
     &type_p_int,
     &type_p_intPtr,
 };
@@ -61,14 +70,17 @@ swig_cast_info *cast_initial[] = {
     casts_p_Pair,
     casts_p_Root,
     casts_p_Shape,
+    casts_p_VStatus,
+    casts_p_VString,
     casts_p_Value,
+    casts_p_char,
     casts_p_int,
     casts_p_intPtr,
 };
 
 }  // namespace
 
-swig_type_info *swig_types[12];
-swig_module_info swig_module = {swig_types, 11, nullptr, type_initial, cast_initial, nullptr};
+swig_type_info *swig_types[15];
+swig_module_info swig_module = {swig_types, 14, nullptr, type_initial, cast_initial, nullptr};
 
 }  // namespace Fixture_wrap

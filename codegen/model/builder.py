@@ -1,0 +1,277 @@
+"""Builds the model of a module from its manifest and its parsed headers."""
+from __future__ import annotations
+
+import codecs
+
+from ..manifest import Manifest
+from ..parse import Class, CType, Function, Headers
+from . import conversions
+from .dispatch import dispatch_rules
+from .records import (METH_NOARGS, METH_O, METH_VARARGS, Candidate, Cast, Constant, Descriptor,
+                      EntryPoint, GlobalVariable, MethodEntry, Module, PointerClass, Result,
+                      WrappedClass)
+from .types import GeneratorError, pointer_descriptor_name, spell, unqualified
+
+REFUSE_PLAIN = 'accessing abstract class or protected constructor'
+OVERLOAD_HEAD = ("Wrong number or type of arguments for overloaded function '{}'.\n"
+                 '  Possible C/C++ prototypes are:\n')
+
+
+class Builder:
+    def __init__(self, manifest: Manifest, headers: Headers):
+        self.m = manifest
+        self.h = headers
+        self.descriptors: dict[str, Descriptor] = {}
+
+    # descriptors
+
+    def descriptor(self, name: str, readable: str) -> Descriptor:
+        d = self.descriptors.get(name)
+        if d is None:
+            d = self.descriptors[name] = Descriptor(name, readable)
+        return d
+
+    def descriptor_for(self, target: CType) -> Descriptor:
+        if target.kind == 'typedef' and target.inner.kind == 'record' and '<' not in target.inner.name:
+            # A typedef of a plain struct names the struct's descriptor, with
+            # the typedef as the other spelling.
+            name, readable = pointer_descriptor_name(target.inner)
+            return self.descriptor(name, f'{target.name} *|{readable}')
+        return self.descriptor(*pointer_descriptor_name(target))
+
+    def class_descriptor(self, cls: str) -> Descriptor:
+        return self.descriptor_for(CType('record', cls))
+
+    def add_cast(self, target: Descriptor, source: Descriptor,
+                 derived_cpp: str | None, base_cpp: str | None):
+        if any(c.source is source for c in target.casts):
+            return
+        target.casts.append(Cast(source, f'cast{source.name}To{target.name}', derived_cpp,
+                                 base_cpp))
+
+    # classes
+
+    def header_class(self, name: str) -> Class:
+        cls = self.h.classes.get(name)
+        if cls is None:
+            raise GeneratorError(f'class {name} is not defined by any header')
+        return cls
+
+    def ancestors(self, name: str) -> list[tuple[str, bool]]:
+        """Public ancestors, nearest first, with whether headers declare them."""
+        out = []
+        while True:
+            cls = self.h.classes.get(name)
+            if cls is not None:
+                bases = [b for b, access in cls.bases if access == 'public']
+                if len(bases) > 1:
+                    raise GeneratorError(f'{name}: more than one public base')
+                base = bases[0] if bases else None
+            else:
+                base = self.m.bases.get(name)
+            if base is None:
+                return out
+            out.append((base, base in self.h.classes))
+            name = base
+
+    def candidate(self, cls: str, fn: Function, entry: str, function: str, first: int,
+                  ctor: bool, director_ctor: bool = False) -> Candidate:
+        """One signature: `first` is the number of the first C++ parameter
+        (2 after `self` or a director's Python object, else 1)."""
+        args = []
+        if not ctor and not fn.static:
+            args.append(conversions.self_argument(cls, entry, fn.const, self.class_descriptor(cls)))
+        slot = first - 1
+        for j, p in enumerate(fn.params):
+            arg = conversions.argument(first + j, slot, p, entry, self.descriptor_for)
+            if arg.slot is not None:
+                slot += 1
+            args.append(arg)
+        python = [a for a in args if a.slot is not None]
+        # Constructors of director classes also take the Python object first.
+        base = 1 if director_ctor else 0
+        required = base + sum(1 for a in python if not a.optional)
+        types = (['PyObject *'] if director_ctor else []) + [spell(p.type) for p in fn.params]
+        name = cls if ctor else fn.name
+        proto = f"{cls}::{name}({','.join(types)})" + (' const' if fn.const else '')
+        res = Result('value', cls, descriptor=self.class_descriptor(cls)) if ctor else \
+            conversions.result(fn.result, entry, self.descriptor_for)
+        return Candidate(function, proto, required, base + len(python), args, res,
+                         f'new {cls}' if ctor else fn.name, fn.static, fn.const)
+
+    def entry_point(self, entry: str, cands_fns: list[Function], build) -> EntryPoint:
+        """Wraps one or several signatures behind the Python name `entry`."""
+        single = len(cands_fns) == 1
+        cands = [build(fn, f'wrap_{entry}' if single else f'wrap_{entry}_{i + 1}')
+                 for i, fn in enumerate(cands_fns)]
+        ep = EntryPoint(entry, f'wrap_{entry}', METH_VARARGS, cands)
+        if single:
+            c = cands[0]
+            if c.min_args == c.max_args == 1:
+                ep.flags = METH_O
+            elif c.max_args == 0:
+                ep.flags = METH_NOARGS
+        else:
+            ep.dispatch = dispatch_rules(cands)
+            ep.max_args = max(c.max_args for c in cands)
+            ep.message = OVERLOAD_HEAD.format(entry) + ''.join(
+                f'    {c.prototype}\n' for c in cands)
+        return ep
+
+    def constructor(self, cls: Class, director: bool) -> EntryPoint | None:
+        public = [c for c in cls.constructors if c.access == 'public']
+        refuse = cls.abstract or (bool(cls.constructors) and not public)
+        if not director and refuse:
+            return None
+        usable = [c for c in cls.constructors if c.access == 'public'
+                  or (director and c.access == 'protected')]
+        if not cls.constructors:
+            usable = [Function(cls.name, 'public', [])]
+        usable = [c for c in usable if not _is_copy(c, cls.name)]
+        entry = f'new_{cls.name}'
+        first = 2 if director else 1
+        ep = self.entry_point(entry, usable, lambda fn, name: self.candidate(
+            cls.name, fn, entry, name, first, ctor=True, director_ctor=director))
+        ep.takes_self, ep.refuse_plain = director, refuse
+        return ep
+
+    def members(self, cls: Class) -> list[EntryPoint]:
+        groups: dict[str, list[Function]] = {}
+        for fn in cls.methods:
+            if fn.access != 'public' or fn.name.startswith('operator'):
+                continue
+            groups.setdefault(fn.name, []).append(fn)
+        out = []
+        for name, fns in groups.items():
+            if len({f.static for f in fns}) > 1:
+                raise GeneratorError(f'{cls.name}::{name}: static and instance overloads mixed')
+            entry = f'{cls.name}_{name}'
+            ep = self.entry_point(entry, fns, lambda fn, fname: self.candidate(
+                cls.name, fn, entry, fname, 1 if fn.static else 2, ctor=False))
+            ep.member, ep.static = name, fns[0].static
+            out.append(ep)
+        return out
+
+    def wrapped_class(self, entry) -> WrappedClass:
+        cls = self.header_class(entry.name)
+        desc = self.class_descriptor(cls.name)
+        ancestors = self.ancestors(cls.name)
+        for ancestor, declared in ancestors:
+            if declared:
+                self.class_descriptor(ancestor)
+        base = ancestors[0][0] if ancestors else None
+        python_base = None
+        if base is not None:
+            if any(c.name == base for c in self.m.classes):
+                python_base = base
+            elif self.m.imports:
+                python_base = f'{self.m.imports[0]}.{base}'
+        constants = [Constant(f'{cls.name}_{n}', v, f'{cls.name}::{n}') for e in cls.enums
+                     if e.access == 'public' for n, v in e.enumerators]
+        variables = []
+        for v in cls.variables:
+            if not v.static or v.access != 'public':
+                continue
+            variables.append(GlobalVariable(f'{cls.name}_{v.name}', f'{cls.name}::{v.name}',
+                                            spell(unqualified(v.type)), self.descriptor_for(v.type),
+                                            v.type.const))
+        return WrappedClass(cls.name, entry.family, entry.header, entry.director, desc, base,
+                            python_base, cls.polymorphic, self.constructor(cls, entry.director),
+                            self.members(cls), constants, variables)
+
+    def pointer_class(self, name: str, element: str) -> PointerClass:
+        if element not in conversions.SCALAR_CONVERTERS:
+            raise GeneratorError(f'pointer class {name}: {element} is not a scalar')
+        own = self.class_descriptor(name)
+        target = self.descriptor_for(CType('builtin', element))
+        self.add_cast(target, own, None, None)
+        return PointerClass(name, element, own, target, conversions.SCALAR_CONVERTERS[element],
+                            conversions.SCALAR_RESULTS[element])
+
+    def casts(self):
+        """Every class with a descriptor converts to each ancestor with one."""
+        names = list(self.h.classes) + [n for n in self.m.bases if n not in self.h.classes]
+        for name in names:
+            source = self.descriptors.get(pointer_descriptor_name(CType('record', name))[0])
+            if source is None:
+                continue
+            for base, _ in self.ancestors(name):
+                target = self.descriptors.get(pointer_descriptor_name(CType('record', base))[0])
+                if target is None:
+                    continue
+                both = name in self.h.classes and base in self.h.classes
+                self.add_cast(target, source, name if both else None, base if both else None)
+        for target, sources in self.m.casts.items():
+            for s in sources:
+                if target not in self.descriptors or s not in self.descriptors:
+                    raise GeneratorError(f'{self.m.source}: cast {s} -> {target} names an '
+                                         'unknown type')
+                self.add_cast(self.descriptors[target], self.descriptors[s], None, None)
+        for d in self.descriptors.values():
+            d.casts.sort(key=lambda c: c.source.name.encode())
+
+    def build(self) -> Module:
+        pointer_classes = [self.pointer_class(n, t) for n, t in self.m.pointer_classes]
+        classes = [self.wrapped_class(e) for e in self.m.classes]
+        repeated = sorted(n for n in self.m.types if n in self.descriptors)
+        if repeated:
+            raise GeneratorError(f'{self.m.source}: the headers derive these types; remove them '
+                                 f'from the manifest: {" ".join(repeated)}')
+        for name, readable in self.m.types.items():
+            self.descriptor(name, readable)
+        self.casts()
+        descriptors = sorted(self.descriptors.values(), key=lambda d: d.name.encode())
+        for i, d in enumerate(descriptors):
+            d.index = i
+
+        entries = [MethodEntry('SWIG_PyInstanceMethod_New', 'swigrt::PyInstanceMethod_New', METH_O),
+                   MethodEntry('SWIG_PyStaticMethod_New', 'swigrt::PyStaticMethod_New', METH_O)]
+        for p in pointer_classes:
+            for what, flags in (('new', METH_VARARGS), ('delete', METH_O), ('assign', METH_VARARGS),
+                                ('value', METH_O), ('cast', METH_O), ('frompointer', METH_O),
+                                ('swigregister', METH_O)):
+                entries.append(MethodEntry(p.entry(what), f'wrap_{p.entry(what)}', flags))
+            entries.append(MethodEntry(p.entry('swiginit'), 'swigrt::ShadowInit', METH_VARARGS))
+        for c in classes:
+            if c.constructor:
+                entries.append(MethodEntry(c.constructor.entry, c.constructor.function,
+                                           c.constructor.flags))
+            entries.append(MethodEntry(c.delete_entry, f'wrap_{c.delete_entry}', METH_O))
+            entries += [MethodEntry(m.entry, m.function, m.flags) for m in c.members]
+            if c.director:
+                entries.append(MethodEntry(f'disown_{c.name}', f'wrap_disown_{c.name}', METH_O))
+            entries.append(MethodEntry(f'{c.name}_swigregister', f'wrap_{c.name}_swigregister',
+                                       METH_O))
+            entries.append(MethodEntry(f'{c.name}_swiginit', 'swigrt::ShadowInit', METH_VARARGS))
+
+        start = [Constant(name, self.string_macro(name), name) for name in self.m.string_constants]
+        installs: list[Constant | GlobalVariable] = []
+        if classes:
+            # The first class's constants go in with the explicit ones, before the
+            # link object exists; its variables lead the link's registrations.
+            start += classes[0].constants
+            installs += classes[0].variables
+            for c in classes[1:]:
+                installs += c.constants + c.variables
+        api = self.h.macros.get(self.m.api_version_macro, '') if self.m.api_version_macro else ''
+        return Module(self.m.name, self.m.proxy, self.m.source, self.m.namespace,
+                      [c.header for c in self.m.classes], self.m.imports, pointer_classes, classes,
+                      descriptors, entries, start, installs, api)
+
+    def string_macro(self, name: str) -> str:
+        text = self.h.macros.get(name)
+        if text is None or not (text.startswith('"') and text.endswith('"')):
+            raise GeneratorError(f'{name} is not a string macro of the headers')
+        raw = codecs.escape_decode(text[1:-1].encode())[0]
+        return raw.decode('utf-8', 'surrogateescape')
+
+
+def _is_copy(f: Function, cls: str) -> bool:
+    if len(f.params) != 1:
+        return False
+    t = f.params[0].type
+    return t.kind in ('lvref', 'rvref') and t.inner.kind == 'record' and t.inner.name == cls
+
+
+def build(manifest: Manifest, headers: Headers) -> Module:
+    return Builder(manifest, headers).build()

@@ -1,0 +1,176 @@
+"""How each C++ parameter is filled from Python and how each C++ result
+becomes a Python object, with the fixed message texts of each argument."""
+from __future__ import annotations
+
+import re
+from typing import Callable
+
+from ..parse import CType, Param
+from .records import Arg, Descriptor, Result
+from .types import GeneratorError, pointer_descriptor_name, spell, unqualified
+
+# Scalar parameter types and the routine that converts each.
+SCALAR_CONVERTERS = {'int': 'AsInt', 'unsigned int': 'AsUnsignedInt', 'short': 'AsShort',
+                     'unsigned char': 'AsUnsignedChar', 'char': 'AsChar', 'bool': 'AsBool',
+                     'double': 'AsDouble', 'float': 'AsFloat'}
+# Scalar result types and the call that makes their Python value.
+SCALAR_RESULTS = {'int': 'PyLong_FromLong', 'short': 'PyLong_FromLong',
+                  'unsigned char': 'PyLong_FromLong', 'unsigned int': 'PyLong_FromSize_t',
+                  'bool': 'PyBool_FromLong', 'double': 'PyFloat_FromDouble',
+                  'float': 'PyFloat_FromDouble', 'char': 'swigrt::FromChar'}
+# Host types converted by the scripting engine rather than wrapped.
+STRING, STRING_ARRAY, STATUS = 'VString', 'VStringArray', 'VStatus'
+PYOBJECT = ('PyObject', '_object')
+
+_NULL_DEFAULTS = frozenset({'0', 'NULL', 'nullptr'})
+_LITERAL = re.compile(r'-?(\d+(\.\d*)?([eE]-?\d+)?[fFuUlL]*|true|false)')
+
+DescriptorFor = Callable[[CType], Descriptor]
+
+
+def _scalar_target(t: CType) -> CType:
+    """A typedef of a scalar or enumeration converts as what it names."""
+    while t.kind == 'typedef' and t.inner.kind in ('builtin', 'enum', 'typedef'):
+        t = CType(t.inner.kind, t.inner.name, t.const or t.inner.const, t.inner.inner)
+    return t
+
+
+def _is(t: CType, kind: str, name: str | None = None) -> bool:
+    return t.kind == kind and (name is None or t.name == name)
+
+
+def _scalar_default(t: CType, text: str) -> str | None:
+    """A default argument usable outside the class: a literal, or an
+    enumerator qualified by its enumeration's scope."""
+    if _LITERAL.fullmatch(text):
+        return text
+    if t.kind == 'enum' and re.fullmatch(r'[A-Za-z_]\w*', text):
+        scope = t.name.rpartition('::')[0]
+        return f'{scope}::{text}' if scope else text
+    if t.kind == 'enum' and re.fullmatch(r'[A-Za-z_][\w:]*', text):
+        return text
+    return None
+
+
+def argument(number: int, slot: int | None, p: Param, entry: str,
+             descriptor_for: DescriptorFor) -> Arg:
+    """How parameter `p`, argument `number` of `entry`, is filled."""
+    t = p.type
+    inner = t.inner if t.kind in ('pointer', 'lvref') else None
+    method = f"in method '{entry}', argument {number} of type "
+
+    def unsupported():
+        return GeneratorError(f'{entry}: parameter {p.name or number} of type {spell(t)} '
+                              'has no conversion')
+
+    def null_default() -> str | None:
+        if p.default is None:
+            return None
+        if p.default not in _NULL_DEFAULTS:
+            raise unsupported()
+        return 'nullptr'
+
+    scalar = _scalar_target(t)
+    if scalar.kind == 'enum' or (scalar.kind == 'builtin' and scalar.name in SCALAR_CONVERTERS):
+        s = spell(unqualified(t))
+        default = None
+        if p.default is not None:
+            default = _scalar_default(scalar, p.default)
+            if default is None:
+                raise unsupported()
+        if scalar.kind == 'enum':
+            return Arg(number, slot, s, 'scalar', 'int', method + f"'{s}'", converter='AsInt',
+                       cast=scalar.name, default=default)
+        return Arg(number, slot, s, 'scalar', scalar.name, method + f"'{s}'",
+                   converter=SCALAR_CONVERTERS[scalar.name], default=default)
+
+    string_like = t if t.kind == 'record' else inner if t.kind == 'lvref' else None
+    if string_like is not None and string_like.kind == 'record' and \
+            string_like.name in (STRING, STRING_ARRAY):
+        if p.default is not None:
+            raise unsupported()
+        output = t.kind == 'lvref' and not string_like.const
+        if string_like.name == STRING:
+            if output:
+                raise unsupported()
+            return Arg(number, slot, spell(t), 'string',
+                       message=f'Expected a String or Unicode object for argument {number}')
+        return Arg(number, slot, spell(t), 'string_array',
+                   message=f'Expected a list of Strings or Unicode objects for argument {number}',
+                   output=output,
+                   list_messages=(f'Argument {number} must be a list object',
+                                  f'Unable to modify argument {number} to return results'))
+
+    if t.kind == 'pointer':
+        # Every pointer parameter has its descriptor, whatever fills it.
+        descriptor_for(inner)
+    if t.kind == 'pointer' and inner.kind == 'record' and inner.name == STRING:
+        return Arg(number, slot, spell(t), 'string_ptr', default=null_default(),
+                   message=f'Expected a String or Unicode object for argument {number}')
+    if t.kind == 'pointer' and _is(inner, 'builtin', 'char'):
+        default = p.default
+        if default is not None and default not in _NULL_DEFAULTS and \
+                not (default.startswith('"') and default.endswith('"')):
+            raise unsupported()
+        if default in _NULL_DEFAULTS:
+            default = 'nullptr'
+        return Arg(number, slot, spell(t), 'chars', message=method + f"'{spell(t)}'",
+                   default=default)
+    if t.kind == 'pointer' and _is(inner, 'record', STATUS):
+        return Arg(number, None, spell(t), 'status_out')
+    if t.kind == 'pointer' and inner.name in PYOBJECT:
+        return Arg(number, slot, spell(t), 'pyobject', default=null_default())
+
+    target = inner if inner is not None else t if t.kind == 'record' else None
+    if target is None or target.kind not in ('record', 'typedef', 'builtin') or \
+            target.kind == 'builtin' and target.name == 'void':
+        raise unsupported()
+    s = spell(t)
+    ref = t.kind != 'pointer'
+    default = None if ref else null_default()
+    if ref and p.default is not None:
+        raise unsupported()
+    return Arg(number, slot, s, 'object', spell(unqualified(target)), method + f"'{s}'",
+               descriptor=descriptor_for(target), reference=ref,
+               null_message=f"invalid null reference {method}'{s}'" if ref else None,
+               default=default)
+
+
+def self_argument(cls: str, entry: str, const: bool, descriptor: Descriptor) -> Arg:
+    """`self` of a member call. A null `self` is refused like a null reference,
+    since calling a member on it could only crash."""
+    s = f'{cls} const *' if const else f'{cls} *'
+    message = f"in method '{entry}', argument 1 of type '{s}'"
+    return Arg(1, 0, s, 'object', cls, message, descriptor=descriptor, reference=True,
+               null_message='invalid null reference ' + message, is_self=True)
+
+
+def result(t: CType, where: str, descriptor_for: DescriptorFor) -> Result:
+    if _is(t, 'builtin', 'void'):
+        return Result('void')
+    scalar = _scalar_target(t)
+    if scalar.kind == 'enum':
+        return Result('scalar', 'long', 'PyLong_FromLong')
+    if scalar.kind == 'builtin' and scalar.name in SCALAR_RESULTS:
+        return Result('scalar', scalar.name, SCALAR_RESULTS[scalar.name])
+    value = t if t.kind == 'record' else t.inner if t.kind == 'lvref' and t.inner.const else None
+    if value is not None and value.kind == 'record':
+        if value.name == STATUS and t.kind == 'record':
+            return Result('status', STATUS)
+        if value.name == STRING:
+            return Result('string', STRING)
+        if value.name == STRING_ARRAY:
+            return Result('string_array', STRING_ARRAY)
+    if t.kind == 'pointer' and _is(t.inner, 'builtin', 'char'):
+        return Result('chars', 'const char *')
+    if t.kind == 'record':
+        return Result('value', t.name, descriptor=descriptor_for(t))
+    if t.kind in ('pointer', 'lvref') and t.inner.kind in ('record', 'typedef', 'builtin'):
+        cpp = spell(unqualified(t.inner))
+        return Result('pointer' if t.kind == 'pointer' else 'reference', cpp,
+                      descriptor=descriptor_for(t.inner))
+    raise GeneratorError(f'{where}: result of type {spell(t)} has no conversion')
+
+
+def descriptor_name(t: CType) -> tuple[str, str]:
+    return pointer_descriptor_name(t)

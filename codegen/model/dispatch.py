@@ -1,0 +1,51 @@
+"""How an overload dispatcher tells its candidates apart."""
+from __future__ import annotations
+
+from .records import Arg, Candidate, DispatchRule
+from .types import GeneratorError
+
+# Argument kinds a dispatcher can test without converting for real.
+TESTABLE = frozenset({'scalar', 'object', 'string', 'string_array', 'string_ptr', 'chars'})
+
+
+def dispatch_rules(cands: list[Candidate]) -> list[DispatchRule]:
+    """Groups argument counts by the candidates that accept them; where several
+    accept one count, each but the last is tested on the first argument in
+    which it differs from the candidates after it, and the last is taken
+    without a test."""
+    lo = min(c.min_args for c in cands)
+    hi = max(c.max_args for c in cands)
+    rules: list[DispatchRule] = []
+    for argc in range(lo, hi + 1):
+        group = [c for c in cands if c.min_args <= argc <= c.max_args]
+        if not group:
+            continue
+        if rules and rules[-1].candidates == group and rules[-1].counts[1] == argc - 1:
+            rules[-1].counts = (rules[-1].counts[0], argc)
+        else:
+            rules.append(DispatchRule((argc, argc), group))
+    for rule in rules:
+        for i, c in enumerate(rule.candidates):
+            if i == len(rule.candidates) - 1:
+                rule.tests.append(None)
+                continue
+            test = _first_difference(c, rule.candidates[i + 1:])
+            if test is None:
+                raise GeneratorError(f'{c.prototype}: no argument tells it apart')
+            rule.tests.append(test)
+    return rules
+
+
+def _python_args(c: Candidate) -> list[Arg]:
+    return sorted((a for a in c.args if a.slot is not None), key=lambda a: a.slot)
+
+
+def _first_difference(c: Candidate, others: list[Candidate]) -> Arg | None:
+    mine = _python_args(c)
+    theirs = [_python_args(o) for o in others]
+    for k, a in enumerate(mine):
+        if k == 0 and not c.static and a.number == 1:
+            continue  # self is converted by the candidate, never tested
+        if any(len(t) <= k or t[k].spelling != a.spelling for t in theirs):
+            return a if a.kind in TESTABLE else None
+    return None

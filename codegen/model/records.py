@@ -1,0 +1,234 @@
+"""The model's records: what a generated module consists of. Filled by the
+builder, read by the emitters."""
+from __future__ import annotations
+
+import hashlib
+import struct
+from dataclasses import dataclass, field
+
+METH_VARARGS = 1
+METH_NOARGS = 4
+METH_O = 8
+
+
+@dataclass
+class Cast:
+    source: 'Descriptor'
+    converter: str                  # C function converting a source pointer
+    derived_cpp: str | None = None  # classes for a checked static_cast, when the
+    base_cpp: str | None = None     # headers declare both
+
+
+@dataclass
+class Descriptor:
+    name: str
+    readable: str
+    casts: list[Cast] = field(default_factory=list)
+    index: int = -1
+
+    @property
+    def macro(self) -> str:
+        return 'SWIGTYPE' + self.name
+
+
+@dataclass
+class Arg:
+    """One C++ parameter of a concrete wrapper and how it is filled.
+
+    kind: scalar, object (a wrapped pointer), string, string_array, string_ptr
+    (an optional `VString const *`), chars (`char const *`), status_out (a
+    `VStatus *` the wrapper owns), pyobject (passed through)."""
+    number: int                  # position in messages, counted from 1 with self
+    slot: int | None             # index in the Python arguments; None when not from Python
+    spelling: str
+    kind: str
+    cpp: str = ''                # scalar: the local's type; object: the type pointed to
+    message: str = ''
+    descriptor: Descriptor | None = None
+    reference: bool = False      # object: a null pointer is refused
+    null_message: str | None = None
+    converter: str = ''          # scalar: the convert/ routine
+    cast: str | None = None      # scalar: the enumeration the local is cast to
+    default: str | None = None   # the C++ value when the argument is absent
+    output: bool = False         # string_array: the list is rewritten after the call
+    list_messages: tuple[str, str] = ('', '')   # not a list, cannot modify
+    is_self: bool = False        # `self` of a member call
+
+    @property
+    def optional(self) -> bool:
+        return self.default is not None
+
+
+@dataclass
+class Result:
+    """How the C++ result becomes the Python result.
+
+    kind: void, status, scalar, chars, string, string_array, value (copied and
+    owned), pointer, reference."""
+    kind: str
+    cpp: str = ''                # the C++ type of the local holding the result
+    converter: str = ''          # scalar: the Python constructor
+    descriptor: Descriptor | None = None
+
+
+@dataclass
+class Candidate:
+    """One C++ signature behind an entry point."""
+    function: str
+    prototype: str
+    min_args: int
+    max_args: int
+    args: list[Arg]              # every C++ parameter, self first for members
+    result: Result
+    call: str                    # "new VPxNode", or the member's name
+    static: bool = False
+    const: bool = False
+
+
+@dataclass
+class DispatchRule:
+    counts: tuple[int, int]       # argc range this rule covers
+    candidates: list[Candidate]   # tried in order; the last one unconditionally
+    tests: list[Arg | None] = field(default_factory=list)  # check-only conversion per candidate
+
+
+@dataclass
+class EntryPoint:
+    """One Python-callable function and the candidates behind it."""
+    entry: str                    # "new_VPxNode", "VPxNode_compute"
+    function: str
+    flags: int
+    candidates: list[Candidate]
+    dispatch: list[DispatchRule] = field(default_factory=list)
+    max_args: int = 0
+    message: str = ''             # the overload message, when there is a dispatcher
+    member: str = ''              # the Python method name; empty for constructors
+    static: bool = False
+    takes_self: bool = False      # constructors: argument 1 is the Python object
+    refuse_plain: bool = False    # constructors: no plain object may be built
+
+
+@dataclass
+class Constant:
+    name: str
+    value: int | str
+    cpp: str = ''                 # the enumerator or macro, "VPxNode::kDependNode"
+
+
+@dataclass
+class GlobalVariable:
+    name: str                     # Python name, "VPxNode_message"
+    cpp: str                      # "VPxNode::message"
+    spelling: str                 # the value type, "VObject"
+    descriptor: Descriptor
+    readonly: bool
+
+    @property
+    def message(self) -> str:
+        if self.readonly:
+            return f'Variable {self.name} is read-only.'
+        return f"in variable '{self.cpp}' of type '{self.spelling}'"
+
+    @property
+    def null_message(self) -> str:
+        return 'invalid null reference ' + self.message
+
+
+@dataclass
+class PointerClass:
+    """A heap cell of one scalar that Python can make, read, write and pass."""
+    name: str                     # "intPtr"
+    element: str                  # "int"
+    descriptor: Descriptor        # _p_intPtr
+    element_descriptor: Descriptor  # _p_int
+    converter: str                # the convert/ routine for assign
+    result: str                   # how value() converts
+
+    def entry(self, what: str) -> str:
+        return {'new': f'new_{self.name}', 'delete': f'delete_{self.name}'}.get(
+            what, f'{self.name}_{what}')
+
+
+@dataclass
+class WrappedClass:
+    name: str
+    family: str
+    header: str
+    director: bool
+    descriptor: Descriptor
+    base: str | None              # nearest wrapped or known base, C++ name
+    python_base: str | None       # "VPxNode" or "OpenVorla.VFnBase"
+    polymorphic: bool
+    constructor: EntryPoint | None
+    members: list[EntryPoint]
+    constants: list[Constant]
+    variables: list[GlobalVariable]
+
+    @property
+    def delete_entry(self) -> str:
+        return f'delete_{self.name}'
+
+
+@dataclass
+class MethodEntry:
+    name: str
+    function: str
+    flags: int
+
+
+@dataclass
+class Module:
+    name: str                     # "_OpenVorlaVPx"
+    proxy: str                    # "OpenVorlaVPx"
+    source: str                   # manifest path, for banners
+    namespace: str
+    headers: list[str]
+    imports: list[str]
+    pointer_classes: list[PointerClass]
+    classes: list[WrappedClass]
+    descriptors: list[Descriptor]
+    entries: list[MethodEntry]
+    start_constants: list[Constant]
+    installs: list[Constant | GlobalVariable]
+    api_version: str
+
+    @property
+    def ident(self) -> str:
+        return self.proxy
+
+    @property
+    def families(self) -> dict[str, list[WrappedClass]]:
+        out: dict[str, list[WrappedClass]] = {}
+        for c in self.classes:
+            out.setdefault(c.family, []).append(c)
+        return dict(sorted(out.items()))
+
+    @property
+    def integer_constants(self) -> list[Constant]:
+        return [c for c in self.start_constants + self.installs
+                if isinstance(c, Constant) and isinstance(c.value, int)]
+
+    @property
+    def variables(self) -> list[GlobalVariable]:
+        return [v for v in self.installs if isinstance(v, GlobalVariable)]
+
+    def signature(self) -> bytes:
+        """The 128-byte block the host reads from a plug-in file: a magic, the
+        interface version, the module's counts, its name and a digest of its
+        interface, so the host can tell builds apart without importing them."""
+        head = b'HLVNPSIG' + struct.pack('<IIIII', int(self.api_version or 0), len(self.entries),
+                                         len(self.descriptors), len(self.integer_constants),
+                                         len(self.variables))
+        block = head + bytes(4) + self.name.encode()[:31].ljust(32, b'\0') + self.interface_digest()
+        return block.ljust(128, b'\0')
+
+    def interface_digest(self) -> bytes:
+        """A digest of what the module offers, for the plug-in signature."""
+        h = hashlib.sha256()
+        for e in self.entries:
+            h.update(f'entry {e.name} {e.flags}\n'.encode())
+        for d in self.descriptors:
+            h.update(f'type {d.name} {d.readable} {[c.source.name for c in d.casts]}\n'.encode())
+        for c in self.start_constants + self.installs:
+            h.update(f'value {c.name}\n'.encode())
+        return h.digest()
