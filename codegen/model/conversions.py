@@ -56,6 +56,10 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
              descriptor_for: DescriptorFor) -> Arg:
     """How parameter `p`, argument `number` of `entry`, is filled."""
     t = p.type
+    declared = spell(t)
+    if t.kind == 'array':
+        # An array parameter is a pointer to its first element.
+        t = CType('pointer', inner=t.inner)
     inner = t.inner if t.kind in ('pointer', 'lvref') else None
     method = f"in method '{entry}', argument {number} of type "
 
@@ -122,15 +126,15 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
         return Arg(number, slot, spell(t), 'pyobject', default=null_default())
 
     target = inner if inner is not None else t if t.kind == 'record' else None
-    if target is None or target.kind not in ('record', 'typedef', 'builtin') or \
+    if target is None or target.kind not in ('record', 'typedef', 'builtin', 'array') or \
             target.kind == 'builtin' and target.name == 'void':
         raise unsupported()
-    s = spell(t)
+    s = declared
     ref = t.kind != 'pointer'
     default = None if ref else null_default()
     if ref and p.default is not None:
         raise unsupported()
-    return Arg(number, slot, s, 'object', spell(unqualified(target)), method + f"'{s}'",
+    return Arg(number, slot, s, 'object', spell(CType('pointer', inner=target)), method + f"'{s}'",
                descriptor=descriptor_for(target), reference=ref,
                null_message=f"invalid null reference {method}'{s}'" if ref else None,
                default=default)
@@ -141,7 +145,7 @@ def self_argument(cls: str, entry: str, const: bool, descriptor: Descriptor) -> 
     since calling a member on it could only crash."""
     s = f'{cls} const *' if const else f'{cls} *'
     message = f"in method '{entry}', argument 1 of type '{s}'"
-    return Arg(1, 0, s, 'object', cls, message, descriptor=descriptor, reference=True,
+    return Arg(1, 0, s, 'object', f'{cls} *', message, descriptor=descriptor, reference=True,
                null_message='invalid null reference ' + message, is_self=True)
 
 

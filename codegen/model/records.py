@@ -42,7 +42,7 @@ class Arg:
     slot: int | None             # index in the Python arguments; None when not from Python
     spelling: str
     kind: str
-    cpp: str = ''                # scalar: the local's type; object: the type pointed to
+    cpp: str = ''                # scalar: the local's type; object: the pointer type
     message: str = ''
     descriptor: Descriptor | None = None
     reference: bool = False      # object: a null pointer is refused

@@ -24,7 +24,10 @@ def spell(t: CType) -> str:
     if t.kind == 'rvref':
         return spell(t.inner) + ' &&'
     if t.kind == 'array':
-        return f'{spell(t.inner)} [{t.size}]'
+        dims, elem = '', t
+        while elem.kind == 'array':
+            dims, elem = dims + f'[{elem.size}]', elem.inner
+        return f'{spell(elem)} {dims}'
     raise GeneratorError(f'no spelling for a {t.kind} type')
 
 

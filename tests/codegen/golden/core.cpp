@@ -133,7 +133,7 @@ static PyObject *wrap_Node_pick_2(Py_ssize_t argc, PyObject **argv) {
   if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Value, &argp2, "in method 'Node_pick', argument 2 of type 'Value const &'", "invalid null reference in method 'Node_pick', argument 2 of type 'Value const &'")) return nullptr;
   int arg3;
   if (!swigrt::ScalarArg(swigrt::AsInt(argv[2], &arg3), "in method 'Node_pick', argument 3 of type 'int'")) return nullptr;
-  PyObject *resultobj = PyBool_FromLong(static_cast<Node *>(argp1)->pick(*static_cast<Value *>(argp2), arg3));
+  PyObject *resultobj = PyBool_FromLong(static_cast<Node *>(argp1)->pick(*static_cast<Value const *>(argp2), arg3));
   if (!resultobj) return nullptr;
   return resultobj;
 }
@@ -270,7 +270,7 @@ static PyObject *wrap_new_Pair_2(Py_ssize_t argc, PyObject **argv) {
   if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Value, &argp2, "in method 'new_Pair', argument 2 of type 'Value &'", "invalid null reference in method 'new_Pair', argument 2 of type 'Value &'")) return nullptr;
   void *argp3 = nullptr;
   if (!swigrt::ReferenceArg(argv[2], SWIGTYPE_p_Node, &argp3, "in method 'new_Pair', argument 3 of type 'Node const &'", "invalid null reference in method 'new_Pair', argument 3 of type 'Node const &'")) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(*static_cast<Value *>(argp2), *static_cast<Node *>(argp3)), SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(*static_cast<Value *>(argp2), *static_cast<Node const *>(argp3)), SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
   return resultobj;
 }
 
