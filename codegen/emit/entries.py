@@ -151,7 +151,7 @@ def _dispatch_branch(rule: DispatchRule) -> str:
         call = f'result = {cand.function}(argc, argv);'
         keyword = 'else ' if i else ''
         if test is None:
-            lines.append(f'    {keyword}{call}\n')
+            lines.append(f'    else\n      {call}\n' if i else f'    {call}\n')
         else:
             lines.append(f'    {keyword}if ({_check(test)})\n      {call}\n')
     return f'if ({cond}) {{\n' + ''.join(lines) + '  }'

@@ -40,12 +40,20 @@ def _python_args(c: Candidate) -> list[Arg]:
     return sorted((a for a in c.args if a.slot is not None), key=lambda a: a.slot)
 
 
+def _discriminates(a: Arg) -> bool:
+    # The bool routine takes any object by its truth value: its check never fails.
+    return a.kind in TESTABLE and a.converter != 'AsBool'
+
+
 def _first_difference(c: Candidate, others: list[Candidate]) -> Arg | None:
+    """The first argument in which `c` differs from the others and whose check
+    can fail; failing that, the first in which it differs at all."""
     mine = _python_args(c)
     theirs = [_python_args(o) for o in others]
-    for k, a in enumerate(mine):
-        if k == 0 and not c.static and a.number == 1:
-            continue  # self is converted by the candidate, never tested
-        if any(len(t) <= k or t[k].spelling != a.spelling for t in theirs):
-            return a if a.kind in TESTABLE else None
-    return None
+    differing = [a for k, a in enumerate(mine)
+                 if not a.is_self and any(len(t) <= k or t[k].spelling != a.spelling
+                                          for t in theirs)]
+    for a in differing:
+        if _discriminates(a):
+            return a
+    return differing[0] if differing and differing[0].kind in TESTABLE else None

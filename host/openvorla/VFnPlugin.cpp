@@ -262,18 +262,20 @@ VStatus VFnPlugin::removeMenuItem(VStringArray &menuItemNames) {
   std::lock_guard<std::mutex> guard(table.mutex);
   PluginRecord *record = table.find(object());
   if (!record) return notAttached();
-  bool allFound = true;
+  // On return the array holds the names that were not found.
+  VStringArray notFound;
   for (unsigned int i = 0; i < menuItemNames.length(); ++i) {
     VString itemName = menuItemNames[i];
     auto &items = record->menuItems;
     auto it = std::find_if(items.begin(), items.end(),
                            [&itemName](const MenuItem &m) { return m.name == itemName; });
     if (it == items.end())
-      allFound = false;
+      notFound.append(itemName);
     else
       items.erase(it);
   }
-  if (!allFound)
+  menuItemNames = notFound;
+  if (notFound.length() != 0)
     return VStatus(VStatus::kInvalidParameter, "A menu item to remove is not one of the plug-in's");
   return VStatus::kSuccess;
 }

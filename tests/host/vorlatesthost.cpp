@@ -1,11 +1,16 @@
 // Test-host module: what a test needs to look at the package as the host and
 // the sibling modules see it.
 #include <standin/Lifetime.h>
+#include <standin/Plugins.h>
 
 #include <cstdint>
 #include <string>
 
 #include "swigrt.h"
+#include "text.h"
+
+using OPENVORLA_NAMESPACE::VObject;
+using OPENVORLA_NAMESPACE::VStringArray;
 
 namespace {
 
@@ -129,6 +134,38 @@ PyObject *descriptor_address(PyObject *, PyObject *arg) {
   return ty ? PyLong_FromVoidPtr(ty) : nullptr;
 }
 
+// load_plugin(name, path) -> a VObject for a plug-in the host has loaded
+PyObject *load_plugin(PyObject *, PyObject *args) {
+  const char *name, *path;
+  if (!PyArg_ParseTuple(args, "ss", &name, &path)) return nullptr;
+  swig_type_info *ty = swigrt::TypeQuery("_p_VObject");
+  if (!ty) return PyErr_Format(PyExc_LookupError, "no type descriptor for VObject");
+  return swigrt::NewPointerObj(nullptr, new VObject(standin::loadPlugin(name, path)), ty,
+                               SWIG_POINTER_OWN);
+}
+
+PyObject *unload_all_plugins(PyObject *, PyObject *) {
+  standin::unloadAllPlugins();
+  Py_RETURN_NONE;
+}
+
+// update_output_list(list, items): rewrites `list` as an entry point does
+// with an output list the host filled with `items`.
+PyObject *update_output_list(PyObject *, PyObject *args) {
+  PyObject *list, *items;
+  if (!PyArg_ParseTuple(args, "OO!", &list, &PyList_Type, &items)) return nullptr;
+  VStringArray array;
+  for (Py_ssize_t i = 0; i < PyList_GET_SIZE(items); ++i) {
+    const char *text = PyUnicode_AsUTF8(PyList_GET_ITEM(items, i));
+    if (!text) return nullptr;
+    array.append(text);
+  }
+  if (!swigrt::UpdateOutputList(list, array, "Argument 3 must be a list object",
+                                "Unable to modify argument 3 to return results"))
+    return nullptr;
+  Py_RETURN_NONE;
+}
+
 template <long (*Count)(const char *)>
 PyObject *counter(PyObject *, PyObject *arg) {
   const char *cls = PyUnicode_AsUTF8(arg);
@@ -144,6 +181,9 @@ PyMethodDef methods[] = {
     {"cast_list", cast_list, METH_O, "Source types of a cast list, in current order."},
     {"modules", modules, METH_NOARGS, "Descriptors of every module sharing the table."},
     {"descriptor_address", descriptor_address, METH_O, "Address of a shared descriptor."},
+    {"load_plugin", load_plugin, METH_VARARGS, "Loads a plug-in in the host: its VObject."},
+    {"unload_all_plugins", unload_all_plugins, METH_NOARGS, "Unloads every plug-in."},
+    {"update_output_list", update_output_list, METH_VARARGS, "Rewrites an output list."},
     {"alive", counter<standin::aliveCount>, METH_O, "Host objects of a class alive now."},
     {"constructed", counter<standin::constructedCount>, METH_O, "Host objects constructed."},
     {"destroyed", counter<standin::destroyedCount>, METH_O, "Host objects destroyed."},
