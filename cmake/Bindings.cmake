@@ -1,4 +1,4 @@
-# openvorla_binding(<manifest> LIBS <host libraries>)
+# openvorla_binding(<manifest> LIBS <host libraries> [SOURCES <hand-written sources>])
 #
 # Generates an extension module from its manifest with the binding generator
 # and builds it into the package directory, linked to its own copy of the
@@ -7,7 +7,7 @@ file(GLOB_RECURSE CODEGEN_SOURCES CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/codegen/
 file(GLOB_RECURSE HOST_HEADERS CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/host/include/*.h)
 
 function(openvorla_binding manifest)
-  cmake_parse_arguments(B "" "" "LIBS" ${ARGN})
+  cmake_parse_arguments(B "" "" "LIBS;SOURCES" ${ARGN})
   set(manifest_path ${CMAKE_SOURCE_DIR}/${manifest})
   get_filename_component(stem ${manifest} NAME_WE)
   set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS
@@ -22,14 +22,14 @@ function(openvorla_binding manifest)
     message(FATAL_ERROR "codegen could not read ${manifest}")
   endif()
   string(REPLACE "\n" ";" outputs "${outputs}")
-  set(gen_dir ${CMAKE_BINARY_DIR}/gen/${stem}/wrap)
+  set(gen_dir ${CMAKE_BINARY_DIR}/gen/${stem})
   list(TRANSFORM outputs PREPEND ${gen_dir}/)
   set(sources ${outputs})
   list(FILTER sources INCLUDE REGEX "\\.cpp$")
 
   # The generator rewrites only files whose text changed; the stamp tells
   # Ninja when it last ran, so unchanged sources are not compiled again.
-  set(stamp ${gen_dir}/../${stem}.stamp)
+  set(stamp ${gen_dir}/${stem}.stamp)
   add_custom_command(
     OUTPUT ${stamp}
     BYPRODUCTS ${outputs} ${PACKAGE_DIR}/${stem}.py
@@ -42,9 +42,10 @@ function(openvorla_binding manifest)
     COMMENT "Generating the ${stem} bindings")
   add_custom_target(${stem}_generated DEPENDS ${stamp})
 
-  Python3_add_library(_${stem} MODULE WITH_SOABI ${sources})
+  list(TRANSFORM B_SOURCES PREPEND ${CMAKE_SOURCE_DIR}/)
+  Python3_add_library(_${stem} MODULE WITH_SOABI ${sources} ${B_SOURCES})
   add_dependencies(_${stem} ${stem}_generated)
-  target_include_directories(_${stem} PRIVATE ${gen_dir})
+  target_include_directories(_${stem} PRIVATE ${gen_dir}/wrap)
   target_link_libraries(_${stem} PRIVATE vpxruntime ${B_LIBS})
   target_compile_options(_${stem} PRIVATE -Wall -Wextra -Werror)
   set_target_properties(_${stem} PROPERTIES

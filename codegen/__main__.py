@@ -12,26 +12,31 @@ import sys
 from . import manifest as manifest_mod
 from . import model as model_mod
 from . import parse as parse_mod
-from .emit import entries, header, init, proxy, table, types, variables
+from .emit import directors, entries, header, init, proxy, table, types, variables
 
 
 def cxx_outputs(m: manifest_mod.Manifest) -> list[str]:
+    """Files a run writes below its output directory: wrap/ and director/."""
     families = sorted({c.family for c in m.classes} | ({'pointers'} if m.pointer_classes else set()))
-    return ([f'{m.proxy}_wrap.h', 'types.cpp', 'method_table.cpp', 'module_init.cpp',
-             'variables.cpp']
-            + [f'{f}.cpp' for f in families])
+    director_families = sorted({c.family for c in m.classes if c.director})
+    return ([f'wrap/{m.proxy}_wrap.h', 'wrap/types.cpp', 'wrap/method_table.cpp',
+             'wrap/module_init.cpp', 'wrap/variables.cpp']
+            + [f'wrap/{f}.cpp' for f in families]
+            + [f'director/{f}.cpp' for f in director_families])
 
 
 def render(module: model_mod.Module) -> dict[str, str]:
-    files = {f'{module.ident}_wrap.h': header.emit(module),
-             'types.cpp': types.emit(module),
-             'method_table.cpp': table.emit(module),
-             'module_init.cpp': init.emit(module),
-             'variables.cpp': variables.emit(module)}
+    files = {f'wrap/{module.ident}_wrap.h': header.emit(module),
+             'wrap/types.cpp': types.emit(module),
+             'wrap/method_table.cpp': table.emit(module),
+             'wrap/module_init.cpp': init.emit(module),
+             'wrap/variables.cpp': variables.emit(module)}
     for family in module.families:
-        files[f'{family}.cpp'] = entries.emit(module, family)
+        files[f'wrap/{family}.cpp'] = entries.emit(module, family)
     if module.pointer_classes:
-        files['pointers.cpp'] = entries.emit(module, 'pointers')
+        files['wrap/pointers.cpp'] = entries.emit(module, 'pointers')
+    for family in module.director_families:
+        files[f'director/{family}.cpp'] = directors.emit(module, family)
     return files
 
 

@@ -28,6 +28,7 @@ class Manifest:
     bases: dict[str, str] = field(default_factory=dict)    # known-by-name class -> base
     casts: dict[str, list[str]] = field(default_factory=dict)  # target -> sources
     pointer_classes: list[tuple[str, str]] = field(default_factory=list)  # (class, scalar)
+    functions: list[str] = field(default_factory=list)  # hand-written, no arguments
     source: str = ''               # manifest path as given, for banners
 
 
@@ -56,6 +57,7 @@ def load(path: str, display_name: str | None = None) -> Manifest:
             types=dict(data.get('types', {})), bases=dict(data.get('bases', {})),
             casts={k: list(v) for k, v in data.get('casts', {}).items()},
             pointer_classes=[(p['name'], p['type']) for p in mod.get('pointer_classes', [])],
+            functions=list(mod.get('functions', [])),
             source=display_name or path)
     except KeyError as e:
         raise ManifestError(f'{path}: missing key {e}') from None

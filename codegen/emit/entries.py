@@ -128,18 +128,70 @@ def _after(c: Candidate) -> str:
     return ''.join(out)
 
 
+def _construct(cls: str, ep: EntryPoint, c: Candidate, values: str) -> str:
+    """A director for a Python subclass's instance, a plain object for None."""
+    wrap = f'{c.result.descriptor.macro}, SWIG_POINTER_NEW'
+    refuse = (f'swigrt::SetErrorMessage(PyExc_RuntimeError, {c_string(REFUSE_PLAIN)});\n'
+              '  return nullptr;\n')
+    if not ep.takes_self:
+        if ep.refuse_plain:
+            return '  ' + refuse
+        return f'  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new {cls}({values}), {wrap});\n'
+    director = f"new SwigDirector_{cls}({', '.join(['argv[0]'] + ([values] if values else []))})"
+    if ep.refuse_plain:
+        out = '  if (argv[0] == Py_None) {\n    ' + refuse.replace('\n  ', '\n    ') + '  }\n'
+        out += f'  {cls} *object = {director};\n'
+    else:
+        out = f'  {cls} *object = argv[0] != Py_None ? {director} : new {cls}({values});\n'
+    return out + f'  PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, {wrap});\n'
+
+
+def _member_call(cls: str, c: Candidate, values: str) -> str:
+    """Calls the member. A call from the object's own Python override of it
+    (the director's self passed as argument 1) is an upcall: the host's own
+    implementation runs, by its qualified name, and the override is not
+    entered again. A protected member is open only inside its own override."""
+    if c.static:
+        return _result(c, f'{cls}::{c.call}({values})')
+    self_ptr = f'static_cast<{cls} *>(argp1)'
+    if c.protected:
+        refused = c_string(f'accessing protected member {c.call}')
+        call = (f'(upcall ? director->{c.call}SwigPublic({values}) : director->{c.call}({values}))'
+                if c.virtual else f'director->{c.call}SwigPublic({values})')
+        return (f'  auto *director = dynamic_cast<SwigDirector_{cls} *>({self_ptr});\n'
+                f'  if (!director || !director->swig_get_inner({c_string(c.call)})) {{\n'
+                f'    swigrt::SetErrorMessage(PyExc_RuntimeError, {refused});\n'
+                '    return nullptr;\n  }\n'
+                + ('  const bool upcall = director->swig_get_self() == argv[0];\n' if c.virtual else '')
+                + _guarded(_result(c, call)))
+    if not c.virtual:
+        return _result(c, f'{self_ptr}->{c.call}({values})')
+    pure = (f'    if (upcall) swigrt::RaisePureVirtual({c_string(f"{c.owner}::{c.call}")});\n'
+            if c.pure else '')
+    call = (f'{self_ptr}->{c.call}({values})' if c.pure else
+            f'(upcall ? {self_ptr}->{cls}::{c.call}({values}) : {self_ptr}->{c.call}({values}))')
+    return ('  auto *director = dynamic_cast<Swig::Director *>(' + self_ptr + ');\n'
+            '  const bool upcall = director && director->swig_get_self() == argv[0];\n'
+            + _guarded(_result(c, call), pure))
+
+
+def _guarded(body: str, first: str = '') -> str:
+    """A director exception means the Python error is set already."""
+    inner = first + ''.join(f'  {line}\n' for line in body.rstrip('\n').split('\n'))
+    return ('  PyObject *resultobj = nullptr;\n  try {\n'
+            + inner.replace('  PyObject *resultobj = ', '  resultobj = ')
+            + '  } catch (Swig::DirectorException &) {\n    return nullptr;\n  }\n')
+
+
 def _body(cls: str, ep: EntryPoint, c: Candidate) -> str:
     out = ''.join(_convert(a) for a in c.args)
     values = ', '.join(_value(a) for a in c.args if not a.is_self)
     if not ep.member:
-        if ep.refuse_plain:
-            return out + (f'  swigrt::SetErrorMessage(PyExc_RuntimeError, '
-                          f'{c_string(REFUSE_PLAIN)});\n  return nullptr;\n')
-        out += (f'  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new {cls}({values}), '
-                f'{c.result.descriptor.macro}, SWIG_POINTER_NEW);\n')
+        out += _construct(cls, ep, c, values)
+        if ep.refuse_plain and not ep.takes_self:
+            return out
     else:
-        target = f'{cls}::' if c.static else f'static_cast<{cls} *>(argp1)->'
-        out += _result(c, f'{target}{c.call}({values})')
+        out += _member_call(cls, c, values)
     return out + _after(c) + '  return resultobj;\n'
 
 
@@ -164,7 +216,8 @@ def entry_point(cls: str, ep: EntryPoint) -> str:
     if not ep.dispatch:
         c = ep.candidates[0]
         if ep.flags == METH_O:
-            argv = '  PyObject *argv[1] = {arg};\n' if any(a.slot is not None for a in c.args) else ''
+            reads = ep.takes_self or any(a.slot is not None for a in c.args)
+            argv = '  PyObject *argv[1] = {arg};\n' if reads else ''
             return head('arg') + '  if (!arg) return nullptr;\n' + argv + _body(cls, ep, c) + '}\n'
         if ep.flags == METH_NOARGS:
             return head('') + _body(cls, ep, c) + '}\n'
@@ -208,6 +261,10 @@ def _class(cls: WrappedClass) -> str:
         out.append(f'PyObject *wrap_disown_{cls.name}(PyObject *, PyObject *arg) {{\n'
                    '  if (!arg) return nullptr;\n  void *argp1 = nullptr;\n'
                    f'  if (!swigrt::PointerArg(arg, {d}, 0, &argp1, {msg})) return nullptr;\n'
+                   '  // The host keeps the object from now on: its director holds the\n'
+                   '  // Python instance until the host deletes it.\n'
+                   f'  auto *director = dynamic_cast<Swig::Director *>(static_cast<{cls.name} *>(argp1));\n'
+                   '  if (director) director->swig_disown();\n'
                    '  Py_RETURN_NONE;\n}\n\n')
     out.append(f'PyObject *wrap_{cls.name}_swigregister(PyObject *, PyObject *args) {{\n'
                f'  return swigrt::RegisterClass(args, {d});\n}}\n\n')

@@ -2,13 +2,16 @@
 from __future__ import annotations
 
 from .common import banner, namespace_close, namespace_open
-from . import variables
+from . import directors, variables
 from ..model import Module
 
 
 def emit(module: Module) -> str:
     out = [banner(module, 'declarations shared by the generated sources'), '#pragma once\n\n',
-           '#include "swigrt.h"\n#include "errors.h"\n#include "args.h"\n#include "dispatch.h"\n#include "scalars.h"\n#include "text.h"\n\n']
+           '#include <map>\n#include <string>\n\n'
+           '#include "swigrt.h"\n#include "errors.h"\n#include "args.h"\n#include "dispatch.h"\n'
+           '#include "scalars.h"\n#include "text.h"\n'
+           + ('#include "director.h"\n#include "forward.h"\n' if module.directors else '') + '\n']
     out += [f'#include <{h}>\n' for h in module.headers]
     if module.namespace:
         out.append(f'\nusing namespace {module.namespace};\n')
@@ -25,5 +28,8 @@ def emit(module: Module) -> str:
         out.append('\n')
     for v in module.variables:
         out.append(f'PyObject *{variables.getter(v)}();\nint {variables.setter(v)}(PyObject *value);\n')
+    if module.directors:
+        out.append('\n')
+        out += [directors.declaration(d) for d in module.directors]
     out.append('\n' + namespace_close(module))
     return ''.join(out)

@@ -7,10 +7,10 @@ from ..manifest import Manifest
 from ..parse import Class, CType, Function, Headers
 from . import conversions
 from .dispatch import dispatch_rules
-from .records import (METH_NOARGS, METH_O, METH_VARARGS, Candidate, Cast, Constant, Descriptor,
-                      EntryPoint, GlobalVariable, MethodEntry, Module, PointerClass, Result,
-                      WrappedClass)
-from .types import GeneratorError, pointer_descriptor_name, spell, unqualified
+from .records import (METH_NOARGS, METH_O, METH_VARARGS, Candidate, Cast, Companion, Constant,
+                      Descriptor, DirectorClass, EntryPoint, Forward, GlobalVariable, MethodEntry,
+                      Module, PointerClass, Result, WrappedClass)
+from .naming import GeneratorError, pointer_descriptor_name, spell, unqualified
 
 REFUSE_PLAIN = 'accessing abstract class or protected constructor'
 OVERLOAD_HEAD = ("Wrong number or type of arguments for overloaded function '{}'.\n"
@@ -135,10 +135,13 @@ class Builder:
         ep.takes_self, ep.refuse_plain = director, refuse
         return ep
 
-    def members(self, cls: Class) -> list[EntryPoint]:
+    def members(self, cls: Class, director: bool) -> list[EntryPoint]:
+        """Public members, and the protected ones of a class Python may derive
+        from (open only inside their own override)."""
         groups: dict[str, list[Function]] = {}
         for fn in cls.methods:
-            if fn.access != 'public' or fn.name.startswith('operator'):
+            if fn.name.startswith('operator') or not (
+                    fn.access == 'public' or (director and fn.access == 'protected')):
                 continue
             groups.setdefault(fn.name, []).append(fn)
         out = []
@@ -149,8 +152,53 @@ class Builder:
             ep = self.entry_point(entry, fns, lambda fn, fname: self.candidate(
                 cls.name, fn, entry, fname, 1 if fn.static else 2, ctor=False))
             ep.member, ep.static = name, fns[0].static
+            for c, fn in zip(ep.candidates, fns):
+                c.virtual, c.pure = director and fn.virtual, fn.pure
+                c.protected, c.owner = fn.access == 'protected', cls.name
             out.append(ep)
         return out
+
+    def virtual_set(self, name: str) -> list[tuple[str, Function]]:
+        """The virtual members of a class and its ancestors that a subclass
+        can override, each signature once with its nearest declaration."""
+        chain = [name] + [b for b, declared in self.ancestors(name) if declared]
+        found: dict[tuple, tuple[str, Function]] = {}
+        for owner in reversed(chain):
+            for fn in self.h.classes[owner].methods:
+                if fn.virtual and fn.access != 'private':
+                    key = (fn.name, tuple(spell(p.type) for p in fn.params), fn.const)
+                    found[key] = (owner, fn)
+        return list(found.values())
+
+    def director_class(self, cls: Class, ctor: EntryPoint) -> DirectorClass:
+        directors = {c.name for c in self.m.classes if c.director}
+        virtuals = self.virtual_set(cls.name)
+        counts: dict[str, set[int]] = {}
+        for _, fn in virtuals:
+            counts.setdefault(fn.name, set()).add(len(fn.params))
+        forwards = []
+        for owner, fn in virtuals:
+            where = f'{owner}::{fn.name}'
+            args = [conversions.forward_argument(p, i + 1, directors, self.descriptor_for)
+                    for i, p in enumerate(fn.params)]
+            result = conversions.forward_result(fn.result, where, self.descriptor_for)
+            forwards.append(Forward(fn.name, owner, args, result, fn.const,
+                                    fn.access == 'protected', fn.pure, len(counts[fn.name]) > 1))
+        companions = []
+        chain = [cls.name] + [b for b, declared in self.ancestors(cls.name) if declared]
+        seen = set()
+        for owner in chain:
+            for fn in self.h.classes[owner].methods:
+                key = (fn.name, tuple(spell(p.type) for p in fn.params), fn.const)
+                if fn.access != 'protected' or fn.static or key in seen:
+                    continue
+                seen.add(key)
+                companions.append(Companion(
+                    fn.name, owner, [(spell(p.type), p.name or f'arg{i + 1}')
+                                     for i, p in enumerate(fn.params)],
+                    spell(fn.result), fn.const, fn.pure))
+        ctors = [[(a.spelling, f'arg{a.number}') for a in c.args] for c in ctor.candidates]
+        return DirectorClass(cls.name, ctors, forwards, companions)
 
     def wrapped_class(self, entry) -> WrappedClass:
         cls = self.header_class(entry.name)
@@ -175,9 +223,13 @@ class Builder:
             variables.append(GlobalVariable(f'{cls.name}_{v.name}', f'{cls.name}::{v.name}',
                                             spell(unqualified(v.type)), self.descriptor_for(v.type),
                                             v.type.const))
-        return WrappedClass(cls.name, entry.family, entry.header, entry.director, desc, base,
-                            python_base, cls.polymorphic, self.constructor(cls, entry.director),
-                            self.members(cls), constants, variables)
+        ctor = self.constructor(cls, entry.director)
+        wrapped = WrappedClass(cls.name, entry.family, entry.header, entry.director, desc, base,
+                               python_base, cls.polymorphic, ctor,
+                               self.members(cls, entry.director), constants, variables)
+        if entry.director:
+            wrapped.director_class = self.director_class(cls, ctor)
+        return wrapped
 
     def pointer_class(self, name: str, element: str) -> PointerClass:
         if element not in conversions.SCALAR_CONVERTERS:
@@ -232,6 +284,8 @@ class Builder:
                                 ('swigregister', METH_O)):
                 entries.append(MethodEntry(p.entry(what), f'wrap_{p.entry(what)}', flags))
             entries.append(MethodEntry(p.entry('swiginit'), 'swigrt::ShadowInit', METH_VARARGS))
+        functions = [MethodEntry(name, f'wrap_{name}', METH_NOARGS) for name in self.m.functions]
+        entries += functions
         for c in classes:
             if c.constructor:
                 entries.append(MethodEntry(c.constructor.entry, c.constructor.function,
@@ -256,7 +310,7 @@ class Builder:
         api = self.h.macros.get(self.m.api_version_macro, '') if self.m.api_version_macro else ''
         return Module(self.m.name, self.m.proxy, self.m.source, self.m.namespace,
                       [c.header for c in self.m.classes], self.m.imports, pointer_classes, classes,
-                      descriptors, entries, start, installs, api)
+                      descriptors, entries, start, installs, api, functions)
 
     def string_macro(self, name: str) -> str:
         text = self.h.macros.get(name)

@@ -6,8 +6,8 @@ import re
 from typing import Callable
 
 from ..parse import CType, Param
-from .records import Arg, Descriptor, Result
-from .types import GeneratorError, pointer_descriptor_name, spell, unqualified
+from .records import Arg, Descriptor, ForwardArg, ForwardResult, Result
+from .naming import GeneratorError, pointer_descriptor_name, spell, unqualified
 
 # Scalar parameter types and the routine that converts each.
 SCALAR_CONVERTERS = {'int': 'AsInt', 'unsigned int': 'AsUnsignedInt', 'short': 'AsShort',
@@ -178,3 +178,57 @@ def result(t: CType, where: str, descriptor_for: DescriptorFor) -> Result:
 
 def descriptor_name(t: CType) -> tuple[str, str]:
     return pointer_descriptor_name(t)
+
+
+# --- the host calling Python: forwarding overrides ------------------------------
+
+def forward_argument(p: Param, index: int, directors: set[str],
+                     descriptor_for: DescriptorFor) -> ForwardArg:
+    t = p.type
+    name = p.name or f'arg{index}'
+    cpp = spell(t)
+    scalar = _scalar_target(t)
+    if scalar.kind == 'enum' or (scalar.kind == 'builtin' and scalar.name in SCALAR_CONVERTERS):
+        kind = {'bool': 'bool', 'unsigned int': 'size_t', 'double': 'double',
+                'float': 'double'}.get(scalar.name, 'long')
+        return ForwardArg(name, cpp, kind)
+    value = t if t.kind == 'record' else t.inner if t.kind == 'lvref' else None
+    if value is not None and value.kind == 'record' and value.name in (STRING, STRING_ARRAY):
+        return ForwardArg(name, cpp, 'string' if value.name == STRING else 'string_array')
+    if t.kind == 'pointer' and _is(t.inner, 'builtin', 'char'):
+        return ForwardArg(name, cpp, 'chars')
+    if t.kind == 'record':
+        return ForwardArg(name, cpp, 'copied', descriptor_for(t), value_type=t.name)
+    if t.kind in ('pointer', 'lvref') and t.inner.kind in ('record', 'typedef', 'builtin'):
+        kind = 'director' if t.inner.kind == 'record' and t.inner.name in directors else 'borrowed'
+        return ForwardArg(name, cpp, kind, descriptor_for(t.inner), pointer=t.kind == 'pointer',
+                          value_type=spell(unqualified(t.inner)))
+    raise GeneratorError(f'argument {name} of type {cpp} cannot be passed to Python')
+
+
+def forward_result(t: CType, where: str, descriptor_for: DescriptorFor) -> ForwardResult:
+    cpp = spell(t)
+    message = f"in output value of type '{cpp}'"
+    if _is(t, 'builtin', 'void'):
+        return ForwardResult('void', cpp)
+    scalar = _scalar_target(t)
+    if scalar.kind == 'enum' or (scalar.kind == 'builtin' and scalar.name in SCALAR_CONVERTERS):
+        if scalar.kind == 'builtin' and scalar.name == 'bool':
+            return ForwardResult('bool', cpp)
+        local = 'int' if scalar.kind == 'enum' else scalar.name
+        converter = 'AsInt' if scalar.kind == 'enum' else SCALAR_CONVERTERS[scalar.name]
+        return ForwardResult('scalar', cpp, local, converter, message=message)
+    if t.kind == 'record' and t.name == STATUS:
+        return ForwardResult('status', cpp)
+    value = t if t.kind == 'record' else t.inner if t.kind == 'lvref' and t.inner.const else None
+    if value is not None and value.kind == 'record' and value.name in (STRING, STRING_ARRAY):
+        return ForwardResult('string' if value.name == STRING else 'string_array', cpp)
+    if t.kind == 'pointer' and _is(t.inner, 'builtin', 'char'):
+        return ForwardResult('chars', cpp, message=message)
+    if t.kind == 'record':
+        return ForwardResult('value', cpp, t.name, descriptor=descriptor_for(t), message=message)
+    if t.kind in ('pointer', 'lvref') and t.inner.kind == 'record':
+        kind = 'pointer' if t.kind == 'pointer' else 'reference'
+        return ForwardResult(kind, cpp, t.inner.name, descriptor=descriptor_for(t.inner),
+                             message=message, null_message='invalid null reference ' + message)
+    raise GeneratorError(f'{where}: result of type {cpp} cannot come from Python')

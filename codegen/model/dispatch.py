@@ -2,7 +2,7 @@
 from __future__ import annotations
 
 from .records import Arg, Candidate, DispatchRule
-from .types import GeneratorError
+from .naming import GeneratorError
 
 # Argument kinds a dispatcher can test without converting for real.
 TESTABLE = frozenset({'scalar', 'object', 'string', 'string_array', 'string_ptr', 'chars'})

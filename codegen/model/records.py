@@ -83,6 +83,10 @@ class Candidate:
     call: str                    # "new VPxNode", or the member's name
     static: bool = False
     const: bool = False
+    virtual: bool = False        # may be carried out by a Python override
+    pure: bool = False
+    protected: bool = False
+    owner: str = ''              # the class that declares the member
 
 
 @dataclass
@@ -163,6 +167,7 @@ class WrappedClass:
     members: list[EntryPoint]
     constants: list[Constant]
     variables: list[GlobalVariable]
+    director_class: 'DirectorClass | None' = None
 
     @property
     def delete_entry(self) -> str:
@@ -191,6 +196,15 @@ class Module:
     start_constants: list[Constant]
     installs: list[Constant | GlobalVariable]
     api_version: str
+    functions: list[MethodEntry] = field(default_factory=list)   # hand-written free functions
+
+    @property
+    def directors(self) -> list['DirectorClass']:
+        return [c.director_class for c in self.classes if c.director_class]
+
+    @property
+    def director_families(self) -> dict[str, list[WrappedClass]]:
+        return {f: cs for f, cs in self.families.items() if any(c.director_class for c in cs)}
 
     @property
     def ident(self) -> str:
@@ -232,3 +246,77 @@ class Module:
         for c in self.start_constants + self.installs:
             h.update(f'value {c.name}\n'.encode())
         return h.digest()
+
+
+@dataclass
+class ForwardArg:
+    """One C++ argument of a forwarding override, made into a Python object.
+
+    kind: borrowed (a wrapped pointer, not owned), director (the object's own
+    Python instance when it is a director), copied (a heap copy Python owns),
+    string, string_array, chars, bool, long, size_t, double."""
+    name: str                     # the override's parameter name
+    cpp: str                      # its declared type
+    kind: str
+    descriptor: Descriptor | None = None
+    pointer: bool = False         # borrowed/director: the parameter is a pointer
+    value_type: str = ''          # copied: the class copied
+
+
+@dataclass
+class ForwardResult:
+    """How the Python result becomes the override's C++ result.
+
+    kind: void, status, bool, scalar, value, reference, pointer, chars,
+    string, string_array."""
+    kind: str
+    cpp: str = ''                 # the override's result type
+    target: str = ''              # value/reference/pointer: the class; scalar: the local type
+    converter: str = ''           # scalar: the convert/ routine
+    descriptor: Descriptor | None = None
+    message: str = ''
+    null_message: str = ''
+
+
+@dataclass
+class Forward:
+    """One forwarding override of a director class."""
+    name: str
+    owner: str                    # the class that declares the implementation
+    args: list[ForwardArg]
+    result: ForwardResult
+    const: bool
+    protected: bool
+    pure: bool
+    arity: bool                   # tested against the Python method's signature
+
+    @property
+    def qualified(self) -> str:
+        return f'{self.owner}::{self.name}'
+
+
+@dataclass
+class DirectorClass:
+    cls: str
+    constructors: list[list[tuple[str, str]]]   # (type, name) per parameter, per constructor
+    forwards: list[Forward]
+    companions: list['Companion']  # protected members reached through <m>SwigPublic
+
+    @property
+    def name(self) -> str:
+        return f'SwigDirector_{self.cls}'
+
+    @property
+    def uninitialized(self) -> str:
+        return f"'self' uninitialized, maybe you forgot to call {self.cls}.__init__."
+
+
+@dataclass
+class Companion:
+    """A protected member made callable from its entry point: <m>SwigPublic."""
+    name: str
+    owner: str
+    params: list[tuple[str, str]]  # (type, name)
+    result: str
+    const: bool
+    pure: bool

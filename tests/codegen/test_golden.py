@@ -37,7 +37,7 @@ def test_matches_golden(name):
     text = outputs()[name]
     path = os.path.join(GOLDEN, name)
     if os.environ.get('OPENVORLA_BLESS'):
-        os.makedirs(GOLDEN, exist_ok=True)
+        os.makedirs(os.path.dirname(path), exist_ok=True)
         with open(path, 'w', encoding='utf-8') as f:
             f.write(text)
     with open(path, encoding='utf-8') as f:

@@ -4,8 +4,11 @@
 #include <standin/Plugins.h>
 
 #include <cstdint>
+#include <map>
 #include <string>
+#include <vector>
 
+#include "director.h"
 #include "swigrt.h"
 #include "text.h"
 
@@ -166,6 +169,233 @@ PyObject *update_output_list(PyObject *, PyObject *args) {
   Py_RETURN_NONE;
 }
 
+// A director as the generated ones are built, minus a proxy-class base: a
+// test holds it through a capsule and plays the host that owns or deletes it.
+class TestDirector : public Swig::Director {
+ public:
+  explicit TestDirector(PyObject *self) : Swig::Director(self) {}
+
+  bool swig_get_inner(const char *name) const override {
+    auto it = swig_inner.find(name);
+    return it != swig_inner.end() && it->second;
+  }
+  void swig_set_inner(const char *name, bool value) const override { swig_inner[name] = value; }
+
+  const std::map<void *, Swig::GCItem_var> &records() const { return swig_owner; }
+  void adopt(void *key, Swig::GCItem *item) { swig_owner.emplace(key, item); }
+
+ private:
+  mutable std::map<std::string, bool> swig_inner;
+};
+
+// Elements of an array that a test lets a director own: their destructors
+// show that the record was deleted, and with array delete.
+int gCountedDestroyed = 0;
+struct Counted {
+  ~Counted() { ++gCountedDestroyed; }
+};
+
+constexpr char kDirectorCapsule[] = "vorlatesthost.director";
+char gDeletedMark;  // capsule context of a handle whose director is gone
+
+Swig::Director *Handle(PyObject *handle) {
+  auto *d = static_cast<Swig::Director *>(PyCapsule_GetPointer(handle, kDirectorCapsule));
+  if (d && PyCapsule_GetContext(handle) == &gDeletedMark) {
+    PyErr_SetString(PyExc_ValueError, "director already deleted");
+    return nullptr;
+  }
+  return d;
+}
+
+TestDirector *AsTestDirector(PyObject *handle) {
+  return static_cast<TestDirector *>(Handle(handle));
+}
+
+PyObject *make_director(PyObject *, PyObject *obj) {
+  return PyCapsule_New(static_cast<Swig::Director *>(new TestDirector(obj)), kDirectorCapsule,
+                       nullptr);
+}
+
+PyObject *director_disown(PyObject *, PyObject *handle) {
+  Swig::Director *d = Handle(handle);
+  if (!d) return nullptr;
+  d->swig_disown();
+  Py_RETURN_NONE;
+}
+
+// director_delete(h, release_lock=False): the host deletes the object, with
+// the interpreter lock released when asked.
+PyObject *director_delete(PyObject *, PyObject *args) {
+  PyObject *handle;
+  int release = 0;
+  if (!PyArg_ParseTuple(args, "O|p", &handle, &release)) return nullptr;
+  Swig::Director *d = Handle(handle);
+  if (!d) return nullptr;
+  PyCapsule_SetContext(handle, &gDeletedMark);
+  if (release) {
+    Py_BEGIN_ALLOW_THREADS delete d;
+    Py_END_ALLOW_THREADS
+  } else {
+    delete d;
+  }
+  Py_RETURN_NONE;
+}
+
+PyObject *director_inner(PyObject *, PyObject *args) {
+  PyObject *handle;
+  const char *name;
+  if (!PyArg_ParseTuple(args, "Os", &handle, &name)) return nullptr;
+  Swig::Director *d = Handle(handle);
+  return d ? PyBool_FromLong(d->swig_get_inner(name)) : nullptr;
+}
+
+PyObject *director_set_inner(PyObject *, PyObject *args) {
+  PyObject *handle;
+  const char *name;
+  int value;
+  if (!PyArg_ParseTuple(args, "Osp", &handle, &name, &value)) return nullptr;
+  Swig::Director *d = Handle(handle);
+  if (!d) return nullptr;
+  d->swig_set_inner(name, value);
+  Py_RETURN_NONE;
+}
+
+// base_inner(name): a bare base, told to close `name`, still answers.
+PyObject *base_inner(PyObject *, PyObject *arg) {
+  const char *name = PyUnicode_AsUTF8(arg);
+  if (!name) return nullptr;
+  Swig::Director bare(Py_None);
+  const Swig::Director &d = bare;
+  d.swig_set_inner(name, false);
+  return PyBool_FromLong(d.swig_get_inner(name));
+}
+
+// own_array(h, n): records n new text buffers, then each of them again, and null.
+PyObject *own_array(PyObject *, PyObject *args) {
+  PyObject *handle;
+  int n;
+  if (!PyArg_ParseTuple(args, "Oi", &handle, &n)) return nullptr;
+  Swig::Director *d = Handle(handle);
+  if (!d) return nullptr;
+  std::vector<char *> buffers;
+  for (int i = 0; i < n; ++i) buffers.push_back(new char[8]());
+  for (int pass = 0; pass < 2; ++pass)
+    for (char *p : buffers) d->swig_acquire_ownership_array(p);
+  d->swig_acquire_ownership_array(nullptr);
+  Py_RETURN_NONE;
+}
+
+// own_object(h, key, own): records the (never dereferenced) address `key`.
+PyObject *own_object(PyObject *, PyObject *args) {
+  PyObject *handle;
+  unsigned long long key;
+  int own;
+  if (!PyArg_ParseTuple(args, "OKi", &handle, &key, &own)) return nullptr;
+  Swig::Director *d = Handle(handle);
+  if (!d) return nullptr;
+  d->swig_acquire_ownership_obj(reinterpret_cast<void *>(static_cast<uintptr_t>(key)), own);
+  Py_RETURN_NONE;
+}
+
+// own_counted(h, n): the director owns an array of n Counted elements.
+PyObject *own_counted(PyObject *, PyObject *args) {
+  PyObject *handle;
+  int n;
+  if (!PyArg_ParseTuple(args, "Oi", &handle, &n)) return nullptr;
+  TestDirector *d = AsTestDirector(handle);
+  if (!d) return nullptr;
+  Counted *elements = new Counted[n];
+  d->adopt(elements, new Swig::GCArray_T<Counted>(elements));
+  Py_RETURN_NONE;
+}
+
+PyObject *counted_destroyed(PyObject *, PyObject *) { return PyLong_FromLong(gCountedDestroyed); }
+
+// owner_records(h) -> get_own() of every ownership record, in the map's order
+PyObject *owner_records(PyObject *, PyObject *handle) {
+  TestDirector *d = AsTestDirector(handle);
+  if (!d) return nullptr;
+  PyObject *out = PyList_New(0);
+  for (const auto &record : d->records()) {
+    PyObject *own = PyLong_FromLong(record.second->get_own());
+    if (!own || PyList_Append(out, own) < 0) Py_CLEAR(out);
+    Py_XDECREF(own);
+    if (!out) break;
+  }
+  return out;
+}
+
+// director_exception(pending, kind, *args) -> (class, what, error type, error text)
+//
+// Sets `pending` (an exception instance, or None) as the pending error, then
+// throws and catches one director exception:
+//   "plain", error, header[, detail]   DirectorException
+//   "pure"[, name]                     DirectorPureVirtualException
+//   "mismatch", error[, detail]        DirectorTypeMismatchException
+//   "raise", header / "raise_pure", name / "raise_mismatch", error, detail
+//                                      the class's raise()
+// and reports what was caught and what the Python error indicator held,
+// which it clears.
+PyObject *director_exception(PyObject *, PyObject *args) {
+  Py_ssize_t n = PyTuple_GET_SIZE(args);
+  if (n < 2) return PyErr_Format(PyExc_TypeError, "expected pending and kind");
+  PyObject *pending = PyTuple_GET_ITEM(args, 0);
+  const char *kind = PyUnicode_AsUTF8(PyTuple_GET_ITEM(args, 1));
+  if (!kind) return nullptr;
+  PyObject *rest = PyTuple_GetSlice(args, 2, n);
+  if (!rest) return nullptr;
+  PyObject *error = nullptr;
+  const char *a = "", *b = "";
+  const std::string k = kind;
+  int parsed;
+  if (k == "plain")
+    parsed = PyArg_ParseTuple(rest, "Os|s", &error, &a, &b);
+  else if (k == "mismatch" || k == "raise_mismatch")
+    parsed = PyArg_ParseTuple(rest, "O|s", &error, &b);
+  else if (k == "pure" || k == "raise" || k == "raise_pure")
+    parsed = PyArg_ParseTuple(rest, "|s", &a);
+  else
+    parsed = (PyErr_Format(PyExc_ValueError, "unknown kind '%s'", kind), 0);
+  if (!parsed) {
+    Py_DECREF(rest);
+    return nullptr;
+  }
+  if (pending != Py_None) PyErr_SetObject(reinterpret_cast<PyObject *>(Py_TYPE(pending)), pending);
+
+  const char *caught = "nothing";
+  std::string what;
+  try {
+    if (k == "plain") throw Swig::DirectorException(error, a, b);
+    if (k == "pure") throw Swig::DirectorPureVirtualException(a);
+    if (k == "mismatch") throw Swig::DirectorTypeMismatchException(error, b);
+    if (k == "raise") Swig::DirectorException::raise(a);
+    if (k == "raise_pure") Swig::DirectorPureVirtualException::raise(a);
+    Swig::DirectorTypeMismatchException::raise(error, b);
+  } catch (const Swig::DirectorPureVirtualException &e) {
+    caught = "DirectorPureVirtualException";
+    what = e.what();
+  } catch (const Swig::DirectorTypeMismatchException &e) {
+    caught = "DirectorTypeMismatchException";
+    what = e.what();
+  } catch (const Swig::DirectorException &e) {
+    caught = "DirectorException";
+    what = e.what();
+  }
+  Py_DECREF(rest);  // the texts above pointed into it
+
+  PyObject *type, *value, *tb;
+  PyErr_Fetch(&type, &value, &tb);
+  PyErr_NormalizeException(&type, &value, &tb);
+  PyObject *text = value ? PyObject_Str(value) : Py_NewRef(Py_None);
+  PyObject *result =
+      text ? Py_BuildValue("(ssOO)", caught, what.c_str(), type ? type : Py_None, text) : nullptr;
+  Py_XDECREF(text);
+  Py_XDECREF(type);
+  Py_XDECREF(value);
+  Py_XDECREF(tb);
+  return result;
+}
+
 template <long (*Count)(const char *)>
 PyObject *counter(PyObject *, PyObject *arg) {
   const char *cls = PyUnicode_AsUTF8(arg);
@@ -187,6 +417,18 @@ PyMethodDef methods[] = {
     {"alive", counter<standin::aliveCount>, METH_O, "Host objects of a class alive now."},
     {"constructed", counter<standin::constructedCount>, METH_O, "Host objects constructed."},
     {"destroyed", counter<standin::destroyedCount>, METH_O, "Host objects destroyed."},
+    {"make_director", make_director, METH_O, "A test director for a Python object: a handle."},
+    {"director_disown", director_disown, METH_O, "swig_disown() on a handle's director."},
+    {"director_delete", director_delete, METH_VARARGS, "Deletes a handle's director as the host."},
+    {"director_inner", director_inner, METH_VARARGS, "swig_get_inner(name) of a director."},
+    {"director_set_inner", director_set_inner, METH_VARARGS, "swig_set_inner(name, value)."},
+    {"base_inner", base_inner, METH_O, "swig_get_inner(name) of a bare Swig::Director."},
+    {"own_array", own_array, METH_VARARGS, "Records new text buffers, each twice, and null."},
+    {"own_object", own_object, METH_VARARGS, "swig_acquire_ownership_obj(key, own)."},
+    {"own_counted", own_counted, METH_VARARGS, "The director owns n counted elements."},
+    {"counted_destroyed", counted_destroyed, METH_NOARGS, "Counted elements destroyed so far."},
+    {"owner_records", owner_records, METH_O, "get_own() of each ownership record."},
+    {"director_exception", director_exception, METH_VARARGS, "Throws and catches one."},
     {nullptr, nullptr, 0, nullptr}};
 
 PyModuleDef module_def = {PyModuleDef_HEAD_INIT, "vorlatesthost", "Plays the host in tests.", -1,

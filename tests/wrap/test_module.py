@@ -67,6 +67,7 @@ def test_method_table_entries_in_order_with_their_flags():
                      (f'{p}_assign', METH_VARARGS), (f'{p}_value', METH_O), (f'{p}_cast', METH_O),
                      (f'{p}_frompointer', METH_O), (f'{p}_swigregister', METH_O),
                      (f'{p}_swiginit', METH_VARARGS)]
+    expected.append(('getLockCaptureCount', METH_NOARGS))
     assert table[2:2 + len(expected)] == expected
     rest = table[2 + len(expected):]
     # Per class: construction and destruction, its members, then the hand-over

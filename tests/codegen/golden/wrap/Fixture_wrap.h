@@ -2,12 +2,17 @@
 // Do not edit; change the headers or the manifest and rebuild.
 #pragma once
 
+#include <map>
+#include <string>
+
 #include "swigrt.h"
 #include "errors.h"
 #include "args.h"
 #include "dispatch.h"
 #include "scalars.h"
 #include "text.h"
+#include "director.h"
+#include "forward.h"
 
 #include <sdk/Base.h>
 #include <sdk/Base.h>
@@ -84,5 +89,117 @@ PyObject *get_Node_identity();
 int set_Node_identity(PyObject *value);
 PyObject *get_Value_kEmpty();
 int set_Value_kEmpty(PyObject *value);
+
+class SwigDirector_Node : public Node, public Swig::Director {
+ public:
+  explicit SwigDirector_Node(PyObject *self);
+  ~SwigDirector_Node() override;
+
+
+  bool swig_get_inner(const char *name) const override {
+    auto it = swig_inner.find(name);
+    return it != swig_inner.end() && it->second;
+  }
+  void swig_set_inner(const char *name, bool value) const override {
+    swig_inner[name] = value;
+  }
+
+ private:
+  mutable std::map<std::string, bool> swig_inner;
+};
+
+class SwigDirector_Shape : public Shape, public Swig::Director {
+ public:
+  explicit SwigDirector_Shape(PyObject *self);
+  ~SwigDirector_Shape() override;
+
+
+  bool swig_get_inner(const char *name) const override {
+    auto it = swig_inner.find(name);
+    return it != swig_inner.end() && it->second;
+  }
+  void swig_set_inner(const char *name, bool value) const override {
+    swig_inner[name] = value;
+  }
+
+ private:
+  mutable std::map<std::string, bool> swig_inner;
+};
+
+class SwigDirector_Mesh : public Mesh, public Swig::Director {
+ public:
+  explicit SwigDirector_Mesh(PyObject *self);
+  ~SwigDirector_Mesh() override;
+
+
+  bool swig_get_inner(const char *name) const override {
+    auto it = swig_inner.find(name);
+    return it != swig_inner.end() && it->second;
+  }
+  void swig_set_inner(const char *name, bool value) const override {
+    swig_inner[name] = value;
+  }
+
+ private:
+  mutable std::map<std::string, bool> swig_inner;
+};
+
+class SwigDirector_Abstract : public Abstract, public Swig::Director {
+ public:
+  explicit SwigDirector_Abstract(PyObject *self);
+  ~SwigDirector_Abstract() override;
+
+  Value name() const override;
+
+  bool swig_get_inner(const char *name) const override {
+    auto it = swig_inner.find(name);
+    return it != swig_inner.end() && it->second;
+  }
+  void swig_set_inner(const char *name, bool value) const override {
+    swig_inner[name] = value;
+  }
+
+ private:
+  mutable std::map<std::string, bool> swig_inner;
+};
+
+class SwigDirector_Hidden : public Hidden, public Swig::Director {
+ public:
+  explicit SwigDirector_Hidden(PyObject *self);
+  ~SwigDirector_Hidden() override;
+
+
+  bool swig_get_inner(const char *name) const override {
+    auto it = swig_inner.find(name);
+    return it != swig_inner.end() && it->second;
+  }
+  void swig_set_inner(const char *name, bool value) const override {
+    swig_inner[name] = value;
+  }
+
+ private:
+  mutable std::map<std::string, bool> swig_inner;
+};
+
+class SwigDirector_Pair : public Pair, public Swig::Director {
+ public:
+  SwigDirector_Pair(PyObject *self, Value & arg2);
+  SwigDirector_Pair(PyObject *self, Value & arg2, Node const & arg3);
+  SwigDirector_Pair(PyObject *self, Node * arg2, Value & arg3, Value & arg4);
+  ~SwigDirector_Pair() override;
+
+
+  bool swig_get_inner(const char *name) const override {
+    auto it = swig_inner.find(name);
+    return it != swig_inner.end() && it->second;
+  }
+  void swig_set_inner(const char *name, bool value) const override {
+    swig_inner[name] = value;
+  }
+
+ private:
+  mutable std::map<std::string, bool> swig_inner;
+};
+
 
 }  // namespace Fixture_wrap

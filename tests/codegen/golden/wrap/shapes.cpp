@@ -8,7 +8,9 @@ namespace Fixture_wrap {
 
 PyObject *wrap_new_Mesh(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Mesh(), SWIGTYPE_p_Mesh, SWIG_POINTER_NEW);
+  PyObject *argv[1] = {arg};
+  Mesh *object = argv[0] != Py_None ? new SwigDirector_Mesh(argv[0]) : new Mesh();
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Mesh, SWIG_POINTER_NEW);
   return resultobj;
 }
 
@@ -24,6 +26,10 @@ PyObject *wrap_disown_Mesh(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Mesh, 0, &argp1, "in method 'disown_Mesh', argument 1 of type 'Mesh *'")) return nullptr;
+  // The host keeps the object from now on: its director holds the
+  // Python instance until the host deletes it.
+  auto *director = dynamic_cast<Swig::Director *>(static_cast<Mesh *>(argp1));
+  if (director) director->swig_disown();
   Py_RETURN_NONE;
 }
 

@@ -8,7 +8,9 @@ namespace Fixture_wrap {
 
 PyObject *wrap_new_Node(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Node(), SWIGTYPE_p_Node, SWIG_POINTER_NEW);
+  PyObject *argv[1] = {arg};
+  Node *object = argv[0] != Py_None ? new SwigDirector_Node(argv[0]) : new Node();
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Node, SWIG_POINTER_NEW);
   return resultobj;
 }
 
@@ -156,6 +158,10 @@ PyObject *wrap_disown_Node(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Node, 0, &argp1, "in method 'disown_Node', argument 1 of type 'Node *'")) return nullptr;
+  // The host keeps the object from now on: its director holds the
+  // Python instance until the host deletes it.
+  auto *director = dynamic_cast<Swig::Director *>(static_cast<Node *>(argp1));
+  if (director) director->swig_disown();
   Py_RETURN_NONE;
 }
 
@@ -167,7 +173,9 @@ PyObject *wrap_Node_swigregister(PyObject *, PyObject *args) {
 
 PyObject *wrap_new_Shape(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Shape(), SWIGTYPE_p_Shape, SWIG_POINTER_NEW);
+  PyObject *argv[1] = {arg};
+  Shape *object = argv[0] != Py_None ? new SwigDirector_Shape(argv[0]) : new Shape();
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Shape, SWIG_POINTER_NEW);
   return resultobj;
 }
 
@@ -183,6 +191,10 @@ PyObject *wrap_disown_Shape(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Shape, 0, &argp1, "in method 'disown_Shape', argument 1 of type 'Shape *'")) return nullptr;
+  // The host keeps the object from now on: its director holds the
+  // Python instance until the host deletes it.
+  auto *director = dynamic_cast<Swig::Director *>(static_cast<Shape *>(argp1));
+  if (director) director->swig_disown();
   Py_RETURN_NONE;
 }
 
@@ -194,8 +206,14 @@ PyObject *wrap_Shape_swigregister(PyObject *, PyObject *args) {
 
 PyObject *wrap_new_Abstract(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
-  swigrt::SetErrorMessage(PyExc_RuntimeError, "accessing abstract class or protected constructor");
-  return nullptr;
+  PyObject *argv[1] = {arg};
+  if (argv[0] == Py_None) {
+    swigrt::SetErrorMessage(PyExc_RuntimeError, "accessing abstract class or protected constructor");
+    return nullptr;
+  }
+  Abstract *object = new SwigDirector_Abstract(argv[0]);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Abstract, SWIG_POINTER_NEW);
+  return resultobj;
 }
 
 PyObject *wrap_delete_Abstract(PyObject *, PyObject *arg) {
@@ -211,8 +229,16 @@ PyObject *wrap_Abstract_name(PyObject *, PyObject *arg) {
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Abstract, &argp1, "in method 'Abstract_name', argument 1 of type 'Abstract const *'", "invalid null reference in method 'Abstract_name', argument 1 of type 'Abstract const *'")) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Value(static_cast<Abstract *>(argp1)->name()), SWIGTYPE_p_Value, SWIG_POINTER_OWN);
-  if (!resultobj) return nullptr;
+  auto *director = dynamic_cast<Swig::Director *>(static_cast<Abstract *>(argp1));
+  const bool upcall = director && director->swig_get_self() == argv[0];
+  PyObject *resultobj = nullptr;
+  try {
+    if (upcall) swigrt::RaisePureVirtual("Abstract::name");
+    resultobj = swigrt::NewPointerObj(nullptr, new Value(static_cast<Abstract *>(argp1)->name()), SWIGTYPE_p_Value, SWIG_POINTER_OWN);
+    if (!resultobj) return nullptr;
+  } catch (Swig::DirectorException &) {
+    return nullptr;
+  }
   return resultobj;
 }
 
@@ -220,6 +246,10 @@ PyObject *wrap_disown_Abstract(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Abstract, 0, &argp1, "in method 'disown_Abstract', argument 1 of type 'Abstract *'")) return nullptr;
+  // The host keeps the object from now on: its director holds the
+  // Python instance until the host deletes it.
+  auto *director = dynamic_cast<Swig::Director *>(static_cast<Abstract *>(argp1));
+  if (director) director->swig_disown();
   Py_RETURN_NONE;
 }
 
@@ -231,8 +261,14 @@ PyObject *wrap_Abstract_swigregister(PyObject *, PyObject *args) {
 
 PyObject *wrap_new_Hidden(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
-  swigrt::SetErrorMessage(PyExc_RuntimeError, "accessing abstract class or protected constructor");
-  return nullptr;
+  PyObject *argv[1] = {arg};
+  if (argv[0] == Py_None) {
+    swigrt::SetErrorMessage(PyExc_RuntimeError, "accessing abstract class or protected constructor");
+    return nullptr;
+  }
+  Hidden *object = new SwigDirector_Hidden(argv[0]);
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Hidden, SWIG_POINTER_NEW);
+  return resultobj;
 }
 
 PyObject *wrap_delete_Hidden(PyObject *, PyObject *arg) {
@@ -247,6 +283,10 @@ PyObject *wrap_disown_Hidden(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Hidden, 0, &argp1, "in method 'disown_Hidden', argument 1 of type 'Hidden *'")) return nullptr;
+  // The host keeps the object from now on: its director holds the
+  // Python instance until the host deletes it.
+  auto *director = dynamic_cast<Swig::Director *>(static_cast<Hidden *>(argp1));
+  if (director) director->swig_disown();
   Py_RETURN_NONE;
 }
 
@@ -260,7 +300,8 @@ static PyObject *wrap_new_Pair_1(Py_ssize_t argc, PyObject **argv) {
   if (argc != 2) return nullptr;
   void *argp2 = nullptr;
   if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Value, &argp2, "in method 'new_Pair', argument 2 of type 'Value &'", "invalid null reference in method 'new_Pair', argument 2 of type 'Value &'")) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(*static_cast<Value *>(argp2)), SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  Pair *object = argv[0] != Py_None ? new SwigDirector_Pair(argv[0], *static_cast<Value *>(argp2)) : new Pair(*static_cast<Value *>(argp2));
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
   return resultobj;
 }
 
@@ -270,7 +311,8 @@ static PyObject *wrap_new_Pair_2(Py_ssize_t argc, PyObject **argv) {
   if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Value, &argp2, "in method 'new_Pair', argument 2 of type 'Value &'", "invalid null reference in method 'new_Pair', argument 2 of type 'Value &'")) return nullptr;
   void *argp3 = nullptr;
   if (!swigrt::ReferenceArg(argv[2], SWIGTYPE_p_Node, &argp3, "in method 'new_Pair', argument 3 of type 'Node const &'", "invalid null reference in method 'new_Pair', argument 3 of type 'Node const &'")) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(*static_cast<Value *>(argp2), *static_cast<Node const *>(argp3)), SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  Pair *object = argv[0] != Py_None ? new SwigDirector_Pair(argv[0], *static_cast<Value *>(argp2), *static_cast<Node const *>(argp3)) : new Pair(*static_cast<Value *>(argp2), *static_cast<Node const *>(argp3));
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
   return resultobj;
 }
 
@@ -282,7 +324,8 @@ static PyObject *wrap_new_Pair_3(Py_ssize_t argc, PyObject **argv) {
   if (!swigrt::ReferenceArg(argv[2], SWIGTYPE_p_Value, &argp3, "in method 'new_Pair', argument 3 of type 'Value &'", "invalid null reference in method 'new_Pair', argument 3 of type 'Value &'")) return nullptr;
   void *argp4 = nullptr;
   if (!swigrt::ReferenceArg(argv[3], SWIGTYPE_p_Value, &argp4, "in method 'new_Pair', argument 4 of type 'Value &'", "invalid null reference in method 'new_Pair', argument 4 of type 'Value &'")) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(static_cast<Node *>(argp2), *static_cast<Value *>(argp3), *static_cast<Value *>(argp4)), SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
+  Pair *object = argv[0] != Py_None ? new SwigDirector_Pair(argv[0], static_cast<Node *>(argp2), *static_cast<Value *>(argp3), *static_cast<Value *>(argp4)) : new Pair(static_cast<Node *>(argp2), *static_cast<Value *>(argp3), *static_cast<Value *>(argp4));
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Pair, SWIG_POINTER_NEW);
   return resultobj;
 }
 
@@ -314,6 +357,10 @@ PyObject *wrap_disown_Pair(PyObject *, PyObject *arg) {
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pair, 0, &argp1, "in method 'disown_Pair', argument 1 of type 'Pair *'")) return nullptr;
+  // The host keeps the object from now on: its director holds the
+  // Python instance until the host deletes it.
+  auto *director = dynamic_cast<Swig::Director *>(static_cast<Pair *>(argp1));
+  if (director) director->swig_disown();
   Py_RETURN_NONE;
 }
 
