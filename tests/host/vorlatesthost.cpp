@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "director.h"
+#include "host_calls.h"
 #include "swigrt.h"
 #include "text.h"
 
@@ -414,6 +415,11 @@ PyMethodDef methods[] = {
     {"load_plugin", load_plugin, METH_VARARGS, "Loads a plug-in in the host: its VObject."},
     {"unload_all_plugins", unload_all_plugins, METH_NOARGS, "Unloads every plug-in."},
     {"update_output_list", update_output_list, METH_VARARGS, "Rewrites an output list."},
+    {"call", host_call, METH_VARARGS, "The host calls a virtual operation once."},
+    {"call_threads", host_call_threads, METH_VARARGS, "Host threads call an operation."},
+    {"host_delete", host_delete, METH_VARARGS, "The host deletes an object it owns."},
+    {"log_entries", log_entries, METH_NOARGS, "The application's log."},
+    {"clear_log", clear_log, METH_NOARGS, "Empties the application's log."},
     {"alive", counter<standin::aliveCount>, METH_O, "Host objects of a class alive now."},
     {"constructed", counter<standin::constructedCount>, METH_O, "Host objects constructed."},
     {"destroyed", counter<standin::destroyedCount>, METH_O, "Host objects destroyed."},
