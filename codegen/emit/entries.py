@@ -17,15 +17,16 @@ def _convert(a: Arg) -> str:
     slot, n = _slot(a), a.number
     present = f'{slot} && ' if a.optional else ''
     if a.kind == 'scalar':
-        local = f'  {a.cpp} arg{n}' + (f' = {a.default};\n' if a.default else ';\n')
+        local = f'  {a.cpp} arg{n}' + (f' = {a.default};\n' if a.default else '{};\n')
         call = f'swigrt::ScalarArg(swigrt::{a.converter}({slot}, &arg{n}), {c_string(a.message)})'
         return f'{local}  if ({present}!{call}) return nullptr;\n'
     if a.kind == 'object':
+        descriptor = a.descriptor.macro if a.descriptor else 'nullptr'
         if a.reference:
-            call = (f'swigrt::ReferenceArg({slot}, {a.descriptor.macro}, &argp{n}, '
+            call = (f'swigrt::ReferenceArg({slot}, {descriptor}, &argp{n}, '
                     f'{c_string(a.message)}, {c_string(a.null_message)})')
         else:
-            call = (f'swigrt::PointerArg({slot}, {a.descriptor.macro}, 0, &argp{n}, '
+            call = (f'swigrt::PointerArg({slot}, {descriptor}, 0, &argp{n}, '
                     f'{c_string(a.message)})')
         return f'  void *argp{n} = nullptr;\n  if ({present}!{call}) return nullptr;\n'
     if a.kind == 'string':
@@ -75,7 +76,8 @@ def _check(a: Arg) -> str:
         return f'SWIG_IsOK(swigrt::{a.converter}({slot}, nullptr))'
     if a.kind == 'object':
         flags = 'SWIG_POINTER_NO_NULL' if a.reference else '0'
-        return f'SWIG_IsOK(swigrt::ConvertPtr({slot}, nullptr, {a.descriptor.macro}, {flags}))'
+        descriptor = a.descriptor.macro if a.descriptor else 'nullptr'
+        return f'SWIG_IsOK(swigrt::ConvertPtr({slot}, nullptr, {descriptor}, {flags}))'
     if a.kind == 'chars':
         return f'SWIG_IsOK(swigrt::AsCharPtr({slot}, nullptr))'
     if a.kind == 'string':

@@ -126,6 +126,10 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
         return Arg(number, slot, spell(t), 'pyobject', default=null_default())
 
     target = inner if inner is not None else t if t.kind == 'record' else None
+    if t.kind == 'pointer' and _is(target, 'builtin', 'void'):
+        # `void *` takes a wrapped pointer of any type.
+        return Arg(number, slot, declared, 'object', 'void *', method + f"'{declared}'",
+                   default=null_default())
     if target is None or target.kind not in ('record', 'typedef', 'builtin', 'array') or \
             target.kind == 'builtin' and target.name == 'void':
         raise unsupported()

@@ -1,4 +1,5 @@
-// VPxGeometryFilter: construction and the static attribute objects.
+// VPxGeometryFilter: construction, the default accessory attribute and the
+// static attribute objects.
 #include <openvorla/VPxGeometryFilter.h>
 
 #include <standin/Lifetime.h>
@@ -8,6 +9,12 @@ OPENVORLA_NAMESPACE_OPEN
 
 VPxGeometryFilter::VPxGeometryFilter() { standin::noteConstructed("VPxGeometryFilter"); }
 VPxGeometryFilter::~VPxGeometryFilter() { standin::noteDestroyed("VPxGeometryFilter"); }
+
+// The filter's own null object, so that no caller can change another's.
+VObject &VPxGeometryFilter::accessoryAttribute() const {
+  fNoAccessory = VObject();
+  return fNoAccessory;
+}
 
 VObject VPxGeometryFilter::input = standin::makeAttribute("VPxGeometryFilter.input");
 VObject VPxGeometryFilter::inputGeom = standin::makeAttribute("VPxGeometryFilter.inputGeom");

@@ -1,4 +1,5 @@
-// VPxSurfaceShape: construction and the static attribute objects.
+// VPxSurfaceShape: the host's default shape behaviour and the static attribute
+// objects.
 #include <openvorla/VPxSurfaceShape.h>
 
 #include <standin/Lifetime.h>
@@ -8,6 +9,45 @@ OPENVORLA_NAMESPACE_OPEN
 
 VPxSurfaceShape::VPxSurfaceShape() { standin::noteConstructed("VPxSurfaceShape"); }
 VPxSurfaceShape::~VPxSurfaceShape() { standin::noteDestroyed("VPxSurfaceShape"); }
+
+VPxNode::Type VPxSurfaceShape::type() const { return kSurfaceShape; }
+bool VPxSurfaceShape::isBounded() const { return false; }
+VBoundingBox VPxSurfaceShape::boundingBox() const { return VBoundingBox(); }
+VObject VPxSurfaceShape::localShapeInAttr() const { return VObject(); }
+VObject VPxSurfaceShape::localShapeOutAttr() const { return VObject(); }
+VObject VPxSurfaceShape::worldShapeOutAttr() const { return VObject(); }
+VObject VPxSurfaceShape::cachedShapeAttr() const { return VObject(); }
+VObject VPxSurfaceShape::geometryData() const { return VObject(); }
+VObject VPxSurfaceShape::createFullVertexGroup() const { return VObject(); }
+
+VSelectionMask VPxSurfaceShape::getShapeSelectionMask() const {
+  return VSelectionMask(VSelectionMask::kSelectPluginShapes);
+}
+
+VSelectionMask VPxSurfaceShape::getComponentSelectionMask() const { return VSelectionMask(); }
+
+bool VPxSurfaceShape::match(const VSelectionMask &mask, const VObjectArray &componentList) const {
+  VSelectionMask own =
+      componentList.length() ? getComponentSelectionMask() : getShapeSelectionMask();
+  return own.intersects(mask);
+}
+
+VPxSurfaceShape::MatchResult VPxSurfaceShape::matchComponent(const VSelectionList &,
+                                                             const VAttributeSpecArray &,
+                                                             VSelectionList &) {
+  return kMatchNone;
+}
+
+bool VPxSurfaceShape::extendSelectionFromComponents(VSelectionList &, VSelectionMask) {
+  return false;
+}
+
+bool VPxSurfaceShape::acceptsGeometryIterator(bool) { return false; }
+bool VPxSurfaceShape::acceptsGeometryIterator(VObject &, bool, bool) { return false; }
+
+VPxGeometryIterator *VPxSurfaceShape::geometryIteratorSetup(VObjectArray &, VObject &, bool) {
+  return nullptr;
+}
 
 VObject VPxSurfaceShape::mHasHistoryOnCreate =
     standin::makeAttribute("VPxSurfaceShape.mHasHistoryOnCreate");

@@ -1,4 +1,4 @@
-// VPxAnimCurveInterpolator: construction and destruction.
+// VPxAnimCurveInterpolator: construction, destruction and the default set-up.
 #include <openvorla/VPxAnimCurveInterpolator.h>
 
 #include <standin/Lifetime.h>
@@ -11,5 +11,8 @@ VPxAnimCurveInterpolator::VPxAnimCurveInterpolator() {
 VPxAnimCurveInterpolator::~VPxAnimCurveInterpolator() {
   standin::noteDestroyed("VPxAnimCurveInterpolator");
 }
+
+void VPxAnimCurveInterpolator::initialize(const VObject &, unsigned int) {}
+const char *VPxAnimCurveInterpolator::className() { return "VPxAnimCurveInterpolator"; }
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -5,24 +5,47 @@
 #include <Python.h>
 
 #include <openvorla/VArgList.h>
+#include <openvorla/VBoundingBox.h>
 #include <openvorla/VCacheSchema.h>
+#include <openvorla/VDagPath.h>
 #include <openvorla/VDataBlock.h>
+#include <openvorla/VDeviceState.h>
 #include <openvorla/VEulerRotation.h>
 #include <openvorla/VEvaluationNode.h>
+#include <openvorla/VEvent.h>
+#include <openvorla/VFileObject.h>
 #include <openvorla/VFnPlugin.h>
 #include <openvorla/VMatrix.h>
 #include <openvorla/VNodeCacheSetupInfo.h>
 #include <openvorla/VPoint.h>
+#include <openvorla/VPx3dModelView.h>
+#include <openvorla/VPxAnimCurveInterpolator.h>
 #include <openvorla/VPxCameraSet.h>
 #include <openvorla/VPxCommand.h>
+#include <openvorla/VPxConstraintCommand.h>
+#include <openvorla/VPxContext.h>
+#include <openvorla/VPxContextCommand.h>
+#include <openvorla/VPxControlCommand.h>
 #include <openvorla/VPxData.h>
+#include <openvorla/VPxFileTranslator.h>
+#include <openvorla/VPxGeometryData.h>
+#include <openvorla/VPxGeometryIterator.h>
 #include <openvorla/VPxIkSolverNode.h>
+#include <openvorla/VPxMidiInputDevice.h>
 #include <openvorla/VPxNode.h>
 #include <openvorla/VPxParticleAttributeMapperNode.h>
 #include <openvorla/VPxPolyTweakUVInteractiveCommand.h>
+#include <openvorla/VPxSurfaceShape.h>
+#include <openvorla/VPxToolCommand.h>
+#include <openvorla/VPxTransform.h>
 #include <openvorla/VPxTransformationMatrix.h>
 #include <openvorla/VPxUIControl.h>
+#include <openvorla/VPxUITableControl.h>
+#include <openvorla/VPxVorlaAsciiFilter.h>
+#include <openvorla/VPxVorlaAsciiFilterOutput.h>
 #include <openvorla/VQuaternion.h>
+#include <openvorla/VSelectionList.h>
+#include <openvorla/VSelectionMask.h>
 #include <openvorla/VStatus.h>
 #include <openvorla/VStringArray.h>
 #include <openvorla/VSyntax.h>
@@ -38,6 +61,7 @@
 
 #include <basekit/Tlog.h>
 
+#include <standin/Files.h>
 #include <standin/Lifetime.h>
 #include <standin/Nodes.h>
 #include <standin/Objects.h>
@@ -81,6 +105,9 @@ static_assert(std::is_abstract_v<VPxData>);
 static_assert(!std::is_default_constructible_v<VPxIkSolverNode>);
 static_assert(!std::is_default_constructible_v<VPxUIControl>);
 static_assert(!std::is_abstract_v<VPxPolyTweakUVInteractiveCommand>);
+static_assert(std::is_abstract_v<VPxGeometryData> && std::is_abstract_v<VPxToolCommand>);
+static_assert(std::is_abstract_v<VPxControlCommand> &&
+              std::is_abstract_v<VPxAnimCurveInterpolator>);
 
 void testStatus() {
   static_assert(sizeof(VStatus) == 3);
@@ -597,8 +624,10 @@ void testPlugins() {
   VStringArray remove;
   remove.append("rig");
   remove.append("rig1");  // the other plug-in's
+  // Each plug-in removes only its own items; the names it did not find stay.
   CHECK(plugin.removeMenuItem(remove) == VStatus::kInvalidParameter);
-  CHECK(second.removeMenuItem(remove) == VStatus::kInvalidParameter);
+  CHECK(remove.length() == 1 && remove[0] == "rig1");
+  CHECK(second.removeMenuItem(remove) && remove.length() == 0);
   CHECK(plugin.addMenuItem("rig", "mainMenu", "c", "", false)[0] == "rig");
 
   PyObject *procs = reinterpret_cast<PyObject *>(&status);  // never dereferenced
@@ -776,6 +805,347 @@ void testNodeOverrides() {
   CHECK(VPxTransformationMatrix::identity.asMatrix() == VMatrix());
 }
 
+void testGeometryValues() {
+  VBoundingBox box;
+  CHECK(box.isEmpty() && !box.contains(VPoint()) && box == VBoundingBox());
+  box.expand(VPoint(1, -2, 3));
+  CHECK(!box.isEmpty() && box.contains(VPoint(1, -2, 3)) && box.width() == 0.0);
+  box.expand(VBoundingBox());
+  box.expand(VPoint(2, 4, 6, 2));  // the cartesian point (1, 2, 3)
+  CHECK(box.min() == VPoint(1, -2, 3) && box.max() == VPoint(1, 2, 3) && box.height() == 4.0);
+  VBoundingBox cube(VPoint(1, 1, 1), VPoint(-1, -1, -1));
+  CHECK(cube.min() == VPoint(-1, -1, -1) && cube.center() == VPoint());
+  CHECK(cube.intersects(VBoundingBox(VPoint(1, 1, 1), VPoint(2, 2, 2))));
+  CHECK(!cube.intersects(VBoundingBox(VPoint(1.5, 0, 0), VPoint(2, 1, 1))) &&
+        cube.intersects(VBoundingBox(VPoint(1.5, 0, 0), VPoint(2, 1, 1)), 0.5));
+  // A quarter turn about z, then a move: the box around the moved corners.
+  VMatrix turn = VQuaternion(M_PI / 2, VVector(0, 0, 1)).asMatrix();
+  turn.setTranslation(VVector(10, 0, 0));
+  VBoundingBox moved(VPoint(0, 0, 0), VPoint(2, 1, 1));
+  moved.transformUsing(turn);
+  CHECK(moved.min().isEquivalent(VPoint(9, 0, 0)) && moved.max().isEquivalent(VPoint(10, 2, 1)));
+  cube.clear();
+  CHECK(cube.isEmpty() && !cube.intersects(moved, 100.0));
+
+  VSelectionMask mask(VSelectionMask::kSelectMeshes);
+  VStatus status;
+  CHECK(mask.addMask(VSelectionMask::kSelectVertices) &&
+        mask.addMask(VSelectionMask::kLast) == VStatus::kInvalidParameter);
+  CHECK(mask.intersects(VSelectionMask::kSelectVertices) &&
+        !mask.intersects(VSelectionMask::kSelectEdges));
+  CHECK(!mask.intersects(static_cast<VSelectionMask::SelectionType>(-1), &status) &&
+        status == VStatus::kInvalidParameter);
+  CHECK((VSelectionMask(VSelectionMask::kSelectEdges) | mask)
+            .intersects(VSelectionMask::kSelectEdges));
+  CHECK(VSelectionMask(VSelectionMask::kLast).isEmpty() && !mask.intersects(VSelectionMask()));
+
+  VObject a = standin::makeObject(VFn::kDagNode, "a"), b = standin::makeObject(VFn::kDagNode, "b");
+  VSelectionList list;
+  CHECK(list.add(a) && list.add(b) && list.add(a) && list.length() == 2);
+  VObject first;
+  CHECK(list.add(a, false) && list.getDependNode(0, first) && first == b);
+  CHECK(list.add(VObject()) == VStatus::kInvalidParameter &&
+        list.getDependNode(2, first) == VStatus::kInvalidParameter);
+  VSelectionList other;
+  other.add(standin::makeObject(VFn::kDagNode, "c"));
+  other.add(b);
+  CHECK(list.merge(other) && list.length() == 3 && list.remove(3) == VStatus::kInvalidParameter);
+
+  VDagPath path;
+  CHECK(!path.isValid() && path.fullPathName(&status) == "" && status.error());
+  CHECK(path.push(a) && path.push(b) && path.push(VObject()) == VStatus::kInvalidParameter);
+  CHECK(path.fullPathName() == "|a|b" && path.partialPathName() == "b" && path.node() == b);
+  CHECK(path.pop(3) == VStatus::kInvalidParameter && path.pop() && path.fullPathName() == "|a");
+}
+
+void testDeviceValues() {
+  VDeviceState state(2, 1);
+  CHECK(!state.isNull() && VDeviceState().isNull() && state.maxAxis() == 2);
+  CHECK(state.setDevicePosition(-40, 1) && state.devicePosition(1) == -40);
+  CHECK(state.setDevicePosition(5, 2) == VStatus::kInvalidParameter &&
+        state.devicePosition(2) == 0);
+  CHECK(state.setButtonState(true, 0) && state.buttonState(0) && !state.buttonState(7) &&
+        state.setButtonState(true, 1) == VStatus::kInvalidParameter);
+
+  VEvent event(12, -3, VEvent::kRightMouse, VEvent::kShiftKey | VEvent::kAltKey);
+  short x = 0, y = 0;
+  CHECK(event.getPosition(x, y) && x == 12 && y == -3);
+  CHECK(event.isModifierShift() && event.isModifierAlt() && !event.isModifierControl());
+  CHECK(event.setMouseButton(static_cast<VEvent::MouseButtonType>(3)) ==
+            VStatus::kInvalidParameter &&
+        event.mouseButton() == VEvent::kRightMouse);
+
+  VFileObject file;
+  CHECK(!file.isSet() && file.setRawFullName("/scenes/shot 1/rig.v1.va"));
+  CHECK(file.rawPath() == "/scenes/shot 1/" && file.rawName() == "rig.v1.va" &&
+        file.extension() == "va" && file.isSet());
+  CHECK(file.setRawName("a/b") == VStatus::kInvalidParameter && file.rawName() == "rig.v1.va");
+  CHECK(file.setRawPath("/tmp") && file.rawFullName() == "/tmp/rig.v1.va");
+  file.setRawFullName("README");
+  CHECK(file.rawPath() == "" && file.extension() == "");
+}
+
+// A transform whose matrix is made through its own creator, with the x
+// translation locked.
+class LockedTransform : public VPxTransform {
+ public:
+  VPxTransformationMatrix *createTransformationMatrix() override {
+    ++made;
+    return new VPxTransformationMatrix();
+  }
+  int made = 0;
+
+ protected:
+  VVector applyTranslationLocks(const VVector &toTest, const VVector &saved,
+                                VStatus *ReturnStatus) override {
+    if (ReturnStatus) *ReturnStatus = VStatus::kSuccess;
+    return VVector(saved.x, toTest.y, toTest.z);
+  }
+};
+
+void testTransform() {
+  standin::resetCounts();
+  {
+    LockedTransform transform;
+    CHECK(transform.made == 0 && transform.type() == VPxNode::kTransformNode);
+    VPxTransformationMatrix &matrix = transform.transformationMatrix();
+    CHECK(transform.made == 1 && &transform.transformationMatrix() == &matrix &&
+          transform.transformationMatrixPtr() == &matrix);
+    CHECK(transform.translateTo(VVector(1, 2, 3)) && matrix.getTranslation() == VVector(1, 2, 3));
+    CHECK(transform.getTranslation(VSpace::kTransform, VDGContext(VTime(4))) == VVector(1, 2, 3));
+    CHECK(transform.getMatrix().translation() == VVector(1, 2, 3));
+
+    // Locks first, then limits: x keeps its value, y is clamped.
+    VDataBlock block;
+    CHECK(transform.setLimit(VFnTransform::kTranslateMaxY, 1.5) &&
+          transform.enableLimit(VFnTransform::kTranslateMaxY, true));
+    CHECK(transform.checkAndSetTranslation(block, VPlug(), VVector(9, 9, 9), VSpace::kTransform));
+    CHECK(transform.getTranslation() == VVector(1, 1.5, 9));
+    CHECK(transform.setLimit(VFnTransform::kTranslateMinY, 2.0) == VStatus::kInvalidParameter &&
+          transform.limitValue(VFnTransform::kTranslateMinY) == -1.0);
+    CHECK(transform.limitValue(VFnTransform::kRotateMaxZ) == 2 * M_PI &&
+          !transform.isLimited(VFnTransform::kRotateMaxZ));
+    VStatus status;
+    CHECK(!transform.isLimited(static_cast<VFnTransform::LimitType>(18), &status) &&
+          status == VStatus::kInvalidParameter);
+    CHECK(transform.setLimit(VFnTransform::kRotateMinX, -1.0) &&
+          transform.enableLimit(VFnTransform::kRotateMinX, true));
+    CHECK(transform.checkAndSetRotation(block, VPlug(), VEulerRotation(-1.4, 0.5, 0),
+                                        VSpace::kTransform));
+    CHECK(transform.getEulerRotation().isEquivalent(VEulerRotation(-1.0, 0.5, 0), 1e-9));
+    CHECK(transform.clearLimits() && !transform.isLimited(VFnTransform::kTranslateMaxY));
+
+    VPxTransformationMatrix other;
+    CHECK(transform.computeLocalTransformation(&other, block) &&
+          other.getTranslation() == VVector(1, 1.5, 9));
+    CHECK(transform.computeLocalTransformation(nullptr, block) == VStatus::kInvalidParameter);
+    transform.resetTransformation(block);
+    CHECK(transform.getTranslation() == VVector() && !transform.isBounded() &&
+          transform.boundingBox().isEmpty());
+  }
+  CHECK(standin::aliveCount("VPxTransformationMatrix") == 0);
+  CHECK(VPxTransform::isNonAffineMatricesEnabled() &&
+        VPxTransform::setNonAffineMatricesEnabled(false) &&
+        !VPxTransform::isNonAffineMatricesEnabled());
+  VPxTransform::setNonAffineMatricesEnabled(true);
+}
+
+class PlainGeometry : public VPxGeometryData {
+ public:
+  void copy(const VPxData &) override { ++copies; }
+  VTypeId typeId() const override { return VTypeId(0x80100); }
+  VString name() const override { return "plainGeometry"; }
+  int copies = 0;
+};
+
+class PlainInterpolator : public VPxAnimCurveInterpolator {
+ public:
+  double evaluate(const VTime &time) override { return time.as(VTime::kSeconds); }
+};
+
+void testGeometryAndShapes() {
+  VObjectArray components;
+  int data = 0;
+  VPxGeometryIterator it(&data, components);
+  CHECK(it.geometry() == &data && it.isDone() && it.next() == VStatus::kFailure);
+  CHECK(it.setMaxPoints(3) && it.setMaxPoints(-1) == VStatus::kInvalidParameter);
+  VPoint point;
+  CHECK(it.setPointGetNext(point) == 0 && it.index() == 1 && it.next() && it.next());
+  CHECK(it.isDone() && it.reset() && it.currentPoint() == 0 && it.iteratorCount() == 3);
+
+  PlainGeometry geometry, source;
+  VMatrix matrix;
+  geometry.smartCopy(nullptr);
+  geometry.smartCopy(&source);
+  CHECK(geometry.copies == 1 && !geometry.matrix(matrix));
+  matrix.setTranslation(VVector(0, 1, 0));
+  geometry.setMatrix(matrix);
+  VMatrix read;
+  CHECK(geometry.matrix(read) && read == matrix);
+  VObject component;
+  CHECK(geometry.iterator(components, component, true) == nullptr);
+
+  VPxSurfaceShape shape;
+  CHECK(shape.type() == VPxNode::kSurfaceShape &&
+        shape.geometryIteratorSetup(components, component) == nullptr);
+  CHECK(shape.match(VSelectionMask::kSelectPluginShapes, components));
+  components.append(standin::makeObject(VFn::kData, "vtx[0]"));
+  CHECK(!shape.match(VSelectionMask::kSelectPluginShapes, components));
+  CHECK(it.setObject(shape) && it.object() == &shape);
+
+  PlainInterpolator interpolator;
+  interpolator.initialize(VObject(), 0);
+  CHECK(interpolator.evaluate(VTime(12, VTime::kFilm)) == 0.5);
+}
+
+// A translator with an extension, and a filter that adds text at its hooks.
+class RigTranslator : public VPxFileTranslator {
+ public:
+  VString defaultExtension() const override { return "rig"; }
+};
+
+class NotingFilter : public VPxVorlaAsciiFilter {
+ public:
+  bool writesRequirements() const override { return requirements; }
+  VStatus writePostHeader(VPxVorlaAsciiFilterOutput &out) override {
+    seenFile = file().rawName();
+    out << "// by " << 2 << " filters, " << 0.1 << "\n";
+    return VStatus::kSuccess;
+  }
+  VStatus writePreTrailer(VPxVorlaAsciiFilterOutput &out) override {
+    out.write("// trailer\n");
+    return failTrailer ? VStatus(VStatus::kFailure) : VStatus(VStatus::kSuccess);
+  }
+  bool requirements = true;
+  bool failTrailer = false;
+  VString seenFile;
+};
+
+void testFileTranslators() {
+  VPxFileTranslator plain;
+  VFileObject file;
+  file.setRawFullName("/tmp/a.rig");
+  CHECK(plain.filter() == "*.*" && RigTranslator().filter() == "*.rig");
+  CHECK(plain.reader(file, "", VPxFileTranslator::kOpenAccessMode) == VStatus::kNotImplemented);
+  CHECK(plain.identifyFile(file, "", 0) == VPxFileTranslator::kNotMyFileType);
+  standin::setFileAccessMode(VPxFileTranslator::kImportAccessMode);
+  CHECK(VPxFileTranslator::fileAccessMode() == VPxFileTranslator::kImportAccessMode);
+  standin::setFileAccessMode(VPxFileTranslator::kUnknownAccessMode);
+
+  NotingFilter filter;
+  file.setRawFullName("/tmp/shot.va");
+  CHECK(filter.haveWriteMethod() && filter.filter() == "*.va");
+  CHECK(filter.writer(file, "", VPxFileTranslator::kSaveAccessMode));
+  CHECK(filter.seenFile == "shot.va" && !filter.file().isSet());
+  CHECK(std::string(standin::lastWrittenScene()) ==
+        "//Vorla ASCII 2025 scene\n//Name: shot.va\n// by 2 filters, 0.1\n"
+        "requires vorla \"2025\";\n// trailer\n// End of shot.va\n");
+  filter.requirements = false;
+  filter.failTrailer = true;
+  CHECK(filter.writer(file, "", VPxFileTranslator::kSaveAccessMode) == VStatus::kFailure);
+  CHECK(contains(standin::lastWrittenScene(), "requires"));  // the failed write left none
+  filter.failTrailer = false;
+  filter.writer(file, "", VPxFileTranslator::kSaveAccessMode);
+  CHECK(!contains(standin::lastWrittenScene(), "requires"));
+  CHECK(filter.writer(VFileObject(), "", VPxFileTranslator::kSaveAccessMode) ==
+        VStatus::kInvalidParameter);
+
+  VPxVorlaAsciiFilterOutput out;
+  out << 1.0 / 3 << " " << -7 << " " << 4000000000u << static_cast<const char *>(nullptr);
+  CHECK(std::string(standin::outputText(out)) == "0.3333333333333333 -7 4000000000");
+}
+
+// A table that refuses selections wider than one column.
+class NarrowTable : public VPxUITableControl {
+ public:
+  bool allowSelection(int, int left, int, int right) const override { return left == right; }
+};
+
+class ConstraintCommand : public VPxConstraintCommand {
+ public:
+  const VObject &objectAttribute() const override { return fObject; }
+  VObjectArray objectAttributes() {
+    VObjectArray array, outputs;
+    getObjectAttributesArray(array);
+    getOutputAttributes(outputs);
+    return outputs.length() == 0 ? array : VObjectArray();
+  }
+  VObject fObject = standin::makeAttribute("translate");
+};
+
+void testInteraction() {
+  VPxContext context;
+  VStatus status;
+  CHECK(context.setImage("move.png", VPxContext::kImage3) &&
+        context.image(VPxContext::kImage3) == "move.png");
+  CHECK(context.setImage("x", static_cast<VPxContext::ImageIndex>(3)) ==
+            VStatus::kInvalidParameter &&
+        context.image(static_cast<VPxContext::ImageIndex>(3), &status) == "" && status.error());
+  VIntArray flags;
+  flags.append(0);
+  flags.append(1);
+  CHECK(!context.ignoreEntry(flags, 0) && context.ignoreEntry(flags, 1) &&
+        context.ignoreEntry(flags, 2));
+  CHECK(context.addManipulator(VObject()) == VStatus::kInvalidParameter &&
+        context.addManipulator(standin::makeObject(VFn::kDagNode, "manip")) &&
+        context.manipulatorCount() == 1 && context.deleteManipulators() &&
+        context.manipulatorCount() == 0);
+  CHECK(context.stringClassName() == "" && context.newToolCommand() == nullptr &&
+        context.argTypeNumericalInput(0) == VSyntax::kNoArg);
+
+  VPxContextCommand contextCommand;
+  CHECK(contextCommand.makeObj() == nullptr && contextCommand.syntax().canEdit());
+  VPxCommand::clearResult();
+  CHECK(contextCommand.setResult(7) && VPxCommand::currentIntResult() == 7);
+  VPxCommand::clearResult();
+
+  NarrowTable table;
+  CHECK(table.setNumberOfRows(4) && table.setNumberOfColumns(3));
+  CHECK(table.setSelection(0, 1, 3, 1) && table.selectedCellCount() == 4);
+  CHECK(table.setSelection(0, 0, 0, 1) == VStatus::kFailure && table.selectedCellCount() == 4);
+  CHECK(table.setSelection(2, 0, 1, 0) == VStatus::kInvalidParameter &&
+        table.addToSelection(0, 3) == VStatus::kInvalidParameter);
+  CHECK(table.setNumberOfRows(2) && table.selectedCellCount() == 2 && table.isSelected(1, 1));
+  CHECK(!table.isSelected(2, 1, &status) && status == VStatus::kInvalidParameter);
+  CHECK(table.setNumberOfRows(4) && !table.isSelected(3, 1) && table.removeFromSelection(0, 1) &&
+        table.selectedCellCount() == 1);
+  CHECK(table.labelString(VPxUITableControl::kColumnLabel, 2) == "3" &&
+        table.labelString(VPxUITableControl::kAllLabels, 2) == "");
+  CHECK(table.suspendUpdates(true) && table.redrawCells() == VStatus::kFailure &&
+        table.suspendUpdates(false) && table.redrawLabels());
+
+  VPx3dModelView view;
+  VDagPath camera, other;
+  camera.push(standin::makeObject(VFn::kDagNode, "persp"));
+  other.push(standin::makeObject(VFn::kDagNode, "top"));
+  CHECK(view.getCamera(camera) == VStatus::kNotFound && view.setCamera(VDagPath()).error());
+  CHECK(view.setCamera(camera));
+  view.removingCamera(other);
+  VDagPath read;
+  CHECK(view.getCamera(read) && read == camera);
+  view.removingCamera(camera);
+  CHECK(view.getCamera(read) == VStatus::kNotFound);
+  CHECK(view.setFogRange(5, 1) == VStatus::kInvalidParameter && view.fogEnd() == 100.0 &&
+        view.setFogDensity(-1) == VStatus::kInvalidParameter);
+  CHECK(view.setLightingMode(static_cast<VPx3dModelView::LightingMode>(9)).error() &&
+        view.lightingMode() == VPx3dModelView::kLightDefault);
+
+  VPxMidiInputDevice device;
+  CHECK(device.openDevice() == VStatus::kFailure && device.getMessage() == nullptr);
+  CHECK(device.setDegreesOfFreedom(2) && device.addChannel(1, "mod") &&
+        device.addChannel(0, "mod") == VStatus::kInvalidParameter &&
+        device.addChannel(2, "pitch") == VStatus::kInvalidParameter);
+  CHECK(device.channelAxis("mod") == 1 && device.channelAxis("pitch") == -1);
+  CHECK(device.setPhysicalButtons(4) && device.setNamedButton("pads", 0, 3) &&
+        device.setNamedButton("pads", 2, 4) == VStatus::kInvalidParameter);
+
+  ConstraintCommand constraint;
+  VObjectArray attributes = constraint.objectAttributes();
+  CHECK(attributes.length() == 1 && attributes[0] == constraint.fObject);
+  CHECK(constraint.constraintOutputAttribute().isNull() &&
+        constraint.targetType() == VPxConstraintCommand::kTransform);
+}
+
 }  // namespace
 
 int main() {
@@ -792,6 +1162,12 @@ int main() {
   testMatricesAndPoints();
   testTimesAndEvaluation();
   testNodeOverrides();
+  testGeometryValues();
+  testDeviceValues();
+  testTransform();
+  testGeometryAndShapes();
+  testFileTranslators();
+  testInteraction();
 
   Py_InitializeEx(0);
   PyThreadState *mainThread = PyEval_SaveThread();

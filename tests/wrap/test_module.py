@@ -29,7 +29,8 @@ VPxHardwareShader VPxManipulatorNode VPxEmitterNode VPxFieldNode VPxFluidEmitter
 VPxSpringNode VPxParticleAttributeMapperNode VPxRenderPassImpl""".split()
 NO_DIRECTOR = {'VFnPlugin', 'VExternalContentInfoTable', 'VExternalContentLocationTable',
                'VPxVorlaAsciiFilterOutput', 'MaterialInputData'}
-NEW_FLAGS = {'VPxMaterialInformation': METH_VARARGS, 'VFnPlugin': METH_VARARGS}
+NEW_FLAGS = {'VPxMaterialInformation': METH_VARARGS, 'VFnPlugin': METH_VARARGS,
+             'VPxGeometryIterator': METH_VARARGS}
 
 
 class PyMethodDef(ctypes.Structure):

@@ -1,7 +1,11 @@
 // Base class of plug-in interpolators between animation keys.
+//
+// The host calls initialize() for each interval between two keys of a curve
+// that uses the interpolator, then evaluate() for times in that interval.
 #pragma once
 
 #include <openvorla/VApiVersion.h>
+#include <openvorla/VObject.h>
 #include <openvorla/VTime.h>
 
 OPENVORLA_NAMESPACE_OPEN
@@ -17,6 +21,10 @@ public:
   virtual ~VPxAnimCurveInterpolator();
 
   virtual double evaluate(const VTime &time) = 0;
+  // The curve and the index of the interval's first key; does nothing by default.
+  virtual void initialize(const VObject &animCurve, unsigned int interval);
+
+  static const char *className();
 };
 
 OPENVORLA_NAMESPACE_CLOSE

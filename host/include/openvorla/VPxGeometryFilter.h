@@ -24,6 +24,10 @@ public:
   VPxGeometryFilter();
   ~VPxGeometryFilter() override;
 
+  // The attribute of the node that an accessory node (a handle the filter
+  // makes along with itself) connects to; the null object by default.
+  virtual VObject &accessoryAttribute() const;
+
   static VObject input;
   static VObject inputGeom;
   static VObject groupId;
@@ -31,6 +35,9 @@ public:
   static VObject outputGeom;
   static VObject envelope;
   static VObject originalGeometry;
+
+private:
+  mutable VObject fNoAccessory;
 };
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -10,6 +10,7 @@ typedef _object PyObject;
 OPENVORLA_NAMESPACE_OPEN
 
 class VAttributePatternArray;
+class VAttributeSpecArray;
 class VRenderProfile;
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -37,7 +37,7 @@ PyObject *wrap_Node_setCount(PyObject *, PyObject *args) {
   if (!swigrt::UnpackTuple(args, "Node_setCount", 2, 3, argv)) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_setCount', argument 1 of type 'Node *'", "invalid null reference in method 'Node_setCount', argument 1 of type 'Node *'")) return nullptr;
-  unsigned int arg2;
+  unsigned int arg2{};
   if (!swigrt::ScalarArg(swigrt::AsUnsignedInt(argv[1], &arg2), "in method 'Node_setCount', argument 2 of type 'unsigned int'")) return nullptr;
   bool arg3 = true;
   if (argv[2] && !swigrt::ScalarArg(swigrt::AsBool(argv[2], &arg3), "in method 'Node_setCount', argument 3 of type 'bool'")) return nullptr;
@@ -120,7 +120,7 @@ static PyObject *wrap_Node_pick_1(Py_ssize_t argc, PyObject **argv) {
   if (argc != 2) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_pick', argument 1 of type 'Node *'", "invalid null reference in method 'Node_pick', argument 1 of type 'Node *'")) return nullptr;
-  int arg2;
+  int arg2{};
   if (!swigrt::ScalarArg(swigrt::AsInt(argv[1], &arg2), "in method 'Node_pick', argument 2 of type 'int'")) return nullptr;
   PyObject *resultobj = PyBool_FromLong(static_cast<Node *>(argp1)->pick(arg2));
   if (!resultobj) return nullptr;
@@ -133,7 +133,7 @@ static PyObject *wrap_Node_pick_2(Py_ssize_t argc, PyObject **argv) {
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_pick', argument 1 of type 'Node *'", "invalid null reference in method 'Node_pick', argument 1 of type 'Node *'")) return nullptr;
   void *argp2 = nullptr;
   if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Value, &argp2, "in method 'Node_pick', argument 2 of type 'Value const &'", "invalid null reference in method 'Node_pick', argument 2 of type 'Value const &'")) return nullptr;
-  int arg3;
+  int arg3{};
   if (!swigrt::ScalarArg(swigrt::AsInt(argv[2], &arg3), "in method 'Node_pick', argument 3 of type 'int'")) return nullptr;
   PyObject *resultobj = PyBool_FromLong(static_cast<Node *>(argp1)->pick(*static_cast<Value const *>(argp2), arg3));
   if (!resultobj) return nullptr;

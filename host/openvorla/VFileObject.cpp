@@ -1,0 +1,54 @@
+// VFileObject: file names split into directory and name.
+#include <openvorla/VFileObject.h>
+
+#include <string>
+
+OPENVORLA_NAMESPACE_OPEN
+
+VFileObject::VFileObject() = default;
+VFileObject::VFileObject(const VFileObject &other) = default;
+VFileObject::~VFileObject() = default;
+VFileObject &VFileObject::operator=(const VFileObject &other) = default;
+
+VStatus VFileObject::setRawName(const VString &name) {
+  if (std::string(name.asUTF8()).find('/') != std::string::npos)
+    return VStatus(VStatus::kInvalidParameter, "A file name holds no separator");
+  fName = name;
+  return VStatus::kSuccess;
+}
+
+VStatus VFileObject::setRawPath(const VString &path) {
+  std::string text = path.asUTF8();
+  if (!text.empty() && text.back() != '/') text += '/';
+  fPath = text.c_str();
+  return VStatus::kSuccess;
+}
+
+VStatus VFileObject::setRawFullName(const VString &fullName) {
+  std::string text = fullName.asUTF8();
+  std::string::size_type cut = text.rfind('/');
+  std::string::size_type nameStart = cut == std::string::npos ? 0 : cut + 1;
+  fPath = text.substr(0, nameStart).c_str();
+  fName = text.substr(nameStart).c_str();
+  return VStatus::kSuccess;
+}
+
+VString VFileObject::rawName() const { return fName; }
+VString VFileObject::rawPath() const { return fPath; }
+VString VFileObject::rawFullName() const { return fPath + fName; }
+
+VString VFileObject::extension() const {
+  std::string name = fName.asUTF8();
+  std::string::size_type dot = name.rfind('.');
+  return dot == std::string::npos ? VString() : VString(name.substr(dot + 1).c_str());
+}
+
+bool VFileObject::isSet() const { return fName.numChars() != 0; }
+
+bool VFileObject::operator==(const VFileObject &other) const {
+  return fPath == other.fPath && fName == other.fName;
+}
+
+bool VFileObject::operator!=(const VFileObject &other) const { return !(*this == other); }
+
+OPENVORLA_NAMESPACE_CLOSE
