@@ -91,15 +91,20 @@ def _forward(d: DirectorClass, f: Forward) -> str:
                     else f'return {d.cls}::{f.name}({names})')
         out.append(f'  if (!swigrt::ArityAccepts(swig_get_self(), {c_string(f.name)}, '
                    f'{len(f.args)})) {fallback};\n')
-    for i, a in enumerate(f.args):
+    passed = [a for a in f.args if a.kind != 'status_out']
+    for i, a in enumerate(passed):
         out.append(f'  swigrt::Ref py_arg{i}({_wrap(a)});\n')
     out.append(f'  if (!swig_get_self()) swigrt::RaiseUninitialized({c_string(d.uninitialized)});\n')
-    if f.args:
-        out.append(f'  PyObject *py_args[] = {{{", ".join(f"py_arg{i}.get()" for i in range(len(f.args)))}}};\n')
-    call_args = f'py_args, {len(f.args)}' if f.args else 'nullptr, 0'
+    if passed:
+        out.append(f'  PyObject *py_args[] = {{{", ".join(f"py_arg{i}.get()" for i in range(len(passed)))}}};\n')
+    call_args = f'py_args, {len(passed)}' if passed else 'nullptr, 0'
     protected = ', true' if f.protected else ''
     out.append(f'  swigrt::Ref py_result(swigrt::CallOverride(this, {c_string(f.name)}, '
                f'{call_args}{protected}));\n')
+    for a in f.args:
+        if a.kind == 'status_out':
+            out.append(f'  if ({a.name}) *{a.name} = swigrt::StatusResult(py_result.get() ? '
+                       'Py_None : nullptr);\n')
     out.append(_convert_result(f) + '}\n\n')
     return ''.join(out)
 

@@ -201,6 +201,10 @@ def forward_argument(p: Param, index: int, directors: set[str],
         return ForwardArg(name, cpp, 'string' if value.name == STRING else 'string_array')
     if t.kind == 'pointer' and _is(t.inner, 'builtin', 'char'):
         return ForwardArg(name, cpp, 'chars')
+    if t.kind == 'pointer' and _is(t.inner, 'record', STATUS):
+        # The Python method has the signature its entry point has, which takes
+        # no status output: the override reports failure by raising.
+        return ForwardArg(name, cpp, 'status_out')
     if t.kind == 'record':
         return ForwardArg(name, cpp, 'copied', descriptor_for(t), value_type=t.name)
     if t.kind in ('pointer', 'lvref') and t.inner.kind in ('record', 'typedef', 'builtin'):

@@ -254,7 +254,8 @@ class ForwardArg:
 
     kind: borrowed (a wrapped pointer, not owned), director (the object's own
     Python instance when it is a director), copied (a heap copy Python owns),
-    string, string_array, chars, bool, long, size_t, double."""
+    string, string_array, chars, bool, long, size_t, double; status_out (not
+    passed: filled with the call's success)."""
     name: str                     # the override's parameter name
     cpp: str                      # its declared type
     kind: str

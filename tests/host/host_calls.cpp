@@ -12,7 +12,11 @@
 #include <openvorla/VPxCommand.h>
 #include <openvorla/VPxData.h>
 #include <openvorla/VPxNode.h>
+#include <openvorla/VPxContext.h>
+#include <openvorla/VPxContextCommand.h>
+#include <openvorla/VPxTransform.h>
 #include <openvorla/VPxTransformationMatrix.h>
+#include <openvorla/VVector.h>
 
 #include <functional>
 #include <map>
@@ -135,6 +139,22 @@ const std::map<std::string, Binder> &Operations() {
            data.copy(source);
            return Received();
          };
+       }},
+      {"VPxTransform::checkAndSetTranslation",
+       [](PyObject *self, PyObject *args) -> HostCall {
+         auto &transform = Object<VPxTransform>(self, "_p_VPxTransform");
+         auto &block = Object<VDataBlock>(Arg(args, 0), "_p_VDataBlock");
+         auto &plug = Object<VPlug>(Arg(args, 1), "_p_VPlug");
+         auto &value = Object<VVector>(Arg(args, 2), "_p_VVector");
+         return [&] {
+           return Status(transform.checkAndSetTranslation(block, plug, value, VSpace::kTransform));
+         };
+       }},
+      {"VPxContextCommand::makeObj",
+       [](PyObject *self, PyObject *) -> HostCall {
+         auto &command = Object<VPxContextCommand>(self, "_p_VPxContextCommand");
+         // The host keeps the context it is handed; the test deletes it later.
+         return [&] { return Received(reinterpret_cast<long long>(command.makeObj())); };
        }},
       {"VPxTransformationMatrix::getTranslation",
        [](PyObject *self, PyObject *) -> HostCall {
@@ -276,6 +296,9 @@ PyObject *host_delete(PyObject *, PyObject *args) {
       {"_p_VPxData", [](void *p) { delete static_cast<VPxData *>(p); }},
       {"_p_VPxTransformationMatrix",
        [](void *p) { delete static_cast<VPxTransformationMatrix *>(p); }},
+      {"_p_VPxTransform", [](void *p) { delete static_cast<VPxTransform *>(p); }},
+      {"_p_VPxContext", [](void *p) { delete static_cast<VPxContext *>(p); }},
+      {"_p_VPxContextCommand", [](void *p) { delete static_cast<VPxContextCommand *>(p); }},
   };
   auto it = deleters.find(type);
   if (it == deleters.end()) return PyErr_Format(PyExc_TypeError, "the host cannot delete a %s", type);
