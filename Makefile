@@ -26,9 +26,12 @@ test: build
 demo: build
 	$(PYTHON) examples/module_summary.py
 
+# Configured again after the install: the bench modules need pybind11 found.
 bench: build
 	@./.ci/apt-install $(BENCH_PACKAGES)
-	@echo "no benchmarks yet"
+	cmake -S . -B $(BUILD)
+	cmake --build $(BUILD) --target bench-modules
+	$(PYTHON) bench/bench_calls.py --build $(BUILD)
 
 clean:
 	rm -rf $(BUILD)

@@ -6,14 +6,49 @@
 
 namespace swigrt {
 
+// The common case of an argument, inline: our own wrapped pointer of exactly
+// the type asked for, bare or as a proxy instance's "this", with no error
+// pending. Anything else is left to ConvertPtr, which gives the same answer
+// for these and handles casts, chains, ownership and None.
+inline bool DirectPointer(PyObject *obj, swig_type_info *ty, void **out) {
+  static PyTypeObject *const wrapper = SwigPyObject_type();
+  if (Py_TYPE(obj) != wrapper) {
+    // None converts (to null) with an error still pending from a string
+    // argument, so it must not reach the lookup that could replace that
+    // error; any other object without "this" fails conversion anyway.
+    if (!ty || obj == Py_None) return false;
+    PyObject *value = PyObject_GenericGetAttr(obj, ThisString());
+    if (!value) {
+      PyErr_Clear();
+      return false;
+    }
+    Py_DECREF(value);  // the instance keeps its "this" alive
+    if (Py_TYPE(value) != wrapper) return false;
+    obj = value;
+  }
+  auto *sobj = reinterpret_cast<SwigPyObject *>(obj);
+  if (sobj->ty != ty || !sobj->ptr) return false;
+  *out = sobj->ptr;
+  return true;
+}
+
 // Converts argument `obj` to a pointer of type `ty`; on failure sets the
 // exception its result code selects, with `message`, and returns false.
 inline bool PointerArg(PyObject *obj, swig_type_info *ty, int flags, void **out,
                        const char *message) {
+  if (flags == 0 && DirectPointer(obj, ty, out)) return true;
   int res = ConvertPtr(obj, out, ty, flags);
   if (SWIG_IsOK(res)) return true;
   SetErrorMessage(ErrorTypeFor(SWIG_ArgError(res)), message);
   return false;
+}
+
+// True when `obj` is an instance of the very class registered for `ty`. A
+// director's Python instance is always of a subclass, so a call with such an
+// object can be no upcall, and the director cross-cast can be skipped.
+inline bool ExactProxy(PyObject *obj, swig_type_info *ty) {
+  auto *data = static_cast<SwigPyClientData *>(ty->clientdata);
+  return data && reinterpret_cast<PyObject *>(Py_TYPE(obj)) == data->klass;
 }
 
 // As PointerArg, for a reference parameter: a null pointer is refused too.

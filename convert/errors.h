@@ -9,7 +9,22 @@ namespace swigrt {
 PyObject *ErrorTypeFor(int code);  // borrowed exception class
 void SetErrorMessage(PyObject *errtype, const char *message);
 // Returns 0 with an exception set, or the number of objects placed plus one.
-Py_ssize_t UnpackTuple(PyObject *args, const char *name, Py_ssize_t min, Py_ssize_t max,
-                       PyObject **objs);
+Py_ssize_t UnpackTupleChecked(PyObject *args, const char *name, Py_ssize_t min, Py_ssize_t max,
+                              PyObject **objs);
+
+// The common case inline: a tuple of an accepted length. Everything else,
+// and every message, is UnpackTupleChecked's.
+inline Py_ssize_t UnpackTuple(PyObject *args, const char *name, Py_ssize_t min, Py_ssize_t max,
+                              PyObject **objs) {
+  if (args && PyTuple_CheckExact(args)) {
+    Py_ssize_t n = PyTuple_GET_SIZE(args);
+    if (n >= min && n <= max) {
+      for (Py_ssize_t i = 0; i < n; ++i) objs[i] = PyTuple_GET_ITEM(args, i);
+      for (Py_ssize_t i = n; i < max; ++i) objs[i] = nullptr;
+      return n + 1;
+    }
+  }
+  return UnpackTupleChecked(args, name, min, max, objs);
+}
 
 }  // namespace swigrt

@@ -20,6 +20,28 @@ PyObject *FromStringArray(const StringArrayType &array) {
   return list;
 }
 
+bool DirectText(PyObject *str, Tstring &out) {
+  wchar_t buffer[128];
+  Py_ssize_t n = PyUnicode_GET_LENGTH(str);
+  if (n < static_cast<Py_ssize_t>(sizeof buffer / sizeof buffer[0])) {
+    if (PyUnicode_AsWideChar(str, buffer, n) != n) {
+      PyErr_Clear();
+      return false;
+    }
+    out.set(buffer, static_cast<size_t>(n));
+    return true;
+  }
+  Py_ssize_t size = 0;
+  wchar_t *text = PyUnicode_AsWideCharString(str, &size);
+  if (!text) {
+    PyErr_Clear();
+    return false;
+  }
+  out.set(text, static_cast<size_t>(size));
+  PyMem_Free(text);
+  return true;
+}
+
 PyObject *UnknownString() {
   static PyObject *unknown = PyUnicode_InternFromString("unknown");
   return unknown;

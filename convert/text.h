@@ -20,7 +20,13 @@ using StringType = OPENVORLA_NAMESPACE::VString;
 using StringArrayType = OPENVORLA_NAMESPACE::VStringArray;
 using StatusType = OPENVORLA_NAMESPACE::VStatus;
 
+// The text of an exact `str`, converted here rather than through the
+// scripting engine (which converts a str no differently) so that the common
+// case does not take the re-entrant interpreter lock again.
+bool DirectText(PyObject *str, Tstring &out);
+
 inline void StringArg(PyObject *obj, StringType &out, const char *message) {
+  if (PyUnicode_CheckExact(obj) && DirectText(obj, out)) return;
   TpythonObjectWithLock value(obj);
   if (!value.getValue(static_cast<Tstring &>(out))) PyErr_SetString(PyExc_TypeError, message);
 }

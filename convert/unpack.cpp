@@ -11,8 +11,8 @@ void NullRest(PyObject **objs, Py_ssize_t from, Py_ssize_t max) {
 
 }  // namespace
 
-Py_ssize_t UnpackTuple(PyObject *args, const char *name, Py_ssize_t min, Py_ssize_t max,
-                       PyObject **objs) {
+Py_ssize_t UnpackTupleChecked(PyObject *args, const char *name, Py_ssize_t min, Py_ssize_t max,
+                              PyObject **objs) {
   // The qualifier is dropped when the count is exact, so an exact count
   // reads "expected 2 arguments" on both sides. Counts print as int.
   const bool exact = min == max;

@@ -172,7 +172,8 @@ def _member_call(cls: str, c: Candidate, values: str) -> str:
             if c.pure else '')
     call = (f'{self_ptr}->{c.call}({values})' if c.pure else
             f'(upcall ? {self_ptr}->{cls}::{c.call}({values}) : {self_ptr}->{c.call}({values}))')
-    return ('  auto *director = dynamic_cast<Swig::Director *>(' + self_ptr + ');\n'
+    return (f'  auto *director = swigrt::ExactProxy(argv[0], SWIGTYPE_p_{cls}) ? nullptr\n'
+            f'                   : dynamic_cast<Swig::Director *>({self_ptr});\n'
             '  const bool upcall = director && director->swig_get_self() == argv[0];\n'
             + _guarded(_result(c, call), pure))
 

@@ -229,7 +229,8 @@ PyObject *wrap_Abstract_name(PyObject *, PyObject *arg) {
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Abstract, &argp1, "in method 'Abstract_name', argument 1 of type 'Abstract const *'", "invalid null reference in method 'Abstract_name', argument 1 of type 'Abstract const *'")) return nullptr;
-  auto *director = dynamic_cast<Swig::Director *>(static_cast<Abstract *>(argp1));
+  auto *director = swigrt::ExactProxy(argv[0], SWIGTYPE_p_Abstract) ? nullptr
+                   : dynamic_cast<Swig::Director *>(static_cast<Abstract *>(argp1));
   const bool upcall = director && director->swig_get_self() == argv[0];
   PyObject *resultobj = nullptr;
   try {

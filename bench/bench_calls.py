@@ -1,0 +1,230 @@
+"""Cost of one call through the generated entry points of _OpenVorlaVPx.
+
+Each row is one calling form of a generated entry point, timed side by side
+with the same host call made through
+  floor    a hand-written C API function doing the same work (bench_floor),
+  pybind11 the same host call bound with pybind11 (bench_pybind),
+  proxy    the generated Python class's method,
+  def      a Python method with explicit arguments forwarding to the built-in,
+  builtin  the built-in made a method with SWIG_PyInstanceMethod_New
+           (SWIG_PyStaticMethod_New for the static row).
+pybind11's methods are called through their class, VPxNode.isAbstractClass(p),
+which is the calling form of the generated entry points.
+
+Times are raw nanoseconds per call (loop included, nothing subtracted), the
+median of many short rounds. In each round a row's variants run back to back,
+in an order that rotates from round to round, and the row's ratios are taken
+there, so that the machine's drift touches the compared variants alike.
+
+Run by `make bench`; `--build DIR` names the build tree.
+"""
+import argparse
+import os
+import platform
+import statistics
+import sys
+import timeit
+
+ROOT = os.path.dirname(os.path.dirname(os.path.abspath(__file__)))
+
+FLOOR_LIMIT = 1.10      # generated / floor, at most
+PYBIND_SPEEDUP = 2.5    # pybind11 / generated, at least
+# The proxy and the built-in forwarder are the same mechanism on two classes;
+# their medians differ by noise alone, which stays within this fraction here.
+PROXY_NOISE = 0.03
+
+VARIANTS = ('generated', 'floor', 'pybind', 'proxy', 'def', 'builtin')
+
+
+_ext = None  # openvorla._OpenVorlaVPx, once the build tree is on the path
+
+
+def forwarding_classes():
+    """Two standalone classes forwarding to the built-ins, one way each; the
+    forwarders read the module as a global, as a module's own classes do."""
+
+    class DefForwarders:
+        def __init__(self, this):
+            self.this = this
+
+        @staticmethod
+        def registeringCallableScript():
+            return _ext.VFnPlugin_registeringCallableScript()
+
+        def isAbstractClass(self):
+            return _ext.VPxNode_isAbstractClass(self)
+
+        def getFilesToArchive(self, shortName=False, unresolvedName=False,
+                              markCouldBeImageSequence=False):
+            return _ext.VPxNode_getFilesToArchive(self, shortName, unresolvedName,
+                                                  markCouldBeImageSequence)
+
+        def copyInternalData(self, node):
+            return _ext.VPxNode_copyInternalData(self, node)
+
+        def setCommandString(self, command):
+            return _ext.VPxCommand_setCommandString(self, command)
+
+        def setVersion(self, version):
+            return _ext.VFnPlugin_setVersion(self, version)
+
+    class BuiltinForwarders:
+        def __init__(self, this):
+            self.this = this
+
+        method = _ext.SWIG_PyInstanceMethod_New
+        registeringCallableScript = _ext.SWIG_PyStaticMethod_New(
+            _ext.VFnPlugin_registeringCallableScript)
+        isAbstractClass = method(_ext.VPxNode_isAbstractClass)
+        getFilesToArchive = method(_ext.VPxNode_getFilesToArchive)
+        copyInternalData = method(_ext.VPxNode_copyInternalData)
+        setCommandString = method(_ext.VPxCommand_setCommandString)
+        setVersion = method(_ext.VFnPlugin_setVersion)
+        del method
+
+    return DefForwarders, BuiltinForwarders
+
+
+def make_rows():
+    """[(label, expected result, {variant: (statement, names)})], and the
+    objects that check() needs."""
+    global _ext
+    from openvorla import OpenVorlaVPx as vpx, _OpenVorlaVPx as _ext
+    import bench_floor as floor
+    import bench_pybind as pb
+
+    node, other, cmd = vpx.VPxNode(), vpx.VPxNode(), vpx.VPxCommand()
+    floor.setup(node.this)
+    plugin = vpx.VFnPlugin(floor.load_plugin('benchCalls'))
+    p_node, p_other, p_cmd = pb.VPxNode(), pb.VPxNode(), pb.VPxCommand()
+    p_plugin = pb.VFnPlugin('benchCalls')  # the same loaded plug-in
+    Def, Builtin = forwarding_classes()
+
+    def row(label, expected, method, generated, floor_fn, pybind_fn, args, host, p_host):
+        """`method` called with `args` on `host`, a proxy; on the class for a
+        static (host None). `a` names the other node in `args`."""
+        static = host is None
+        call = f'({", ".join(("s",) * (not static) + args)})'
+        method_call = f'o.{method}({", ".join(args)})'
+        names = dict(s=host, a=other)
+        for_class = lambda cls: dict(names, o=cls if static else cls(host.this))
+        return (label, expected, {
+            'generated': ('f' + call, dict(names, f=generated)),
+            'floor': ('f' + call, dict(names, f=floor_fn)),
+            'pybind': ('f' + call, dict(s=p_host, a=p_other, f=pybind_fn)),
+            'proxy': (method_call, dict(names, o=vpx.VFnPlugin if static else host)),
+            'def': (method_call, for_class(Def)),
+            'builtin': (method_call, for_class(Builtin)),
+        })
+
+    text = '"polyCube -w 2"'
+    return [
+        row('no argument', False, 'registeringCallableScript',
+            _ext.VFnPlugin_registeringCallableScript, floor.registeringCallableScript,
+            pb.registeringCallableScript, (), None, None),
+        row('one object', False, 'isAbstractClass', _ext.VPxNode_isAbstractClass,
+            floor.isAbstractClass, pb.VPxNode.isAbstractClass, (), node, p_node),
+        row('tuple of scalars', [], 'getFilesToArchive', _ext.VPxNode_getFilesToArchive,
+            floor.getFilesToArchive, pb.VPxNode.getFilesToArchive, ('False', 'True', 'False'),
+            node, p_node),
+        row('wrapped object', None, 'copyInternalData', _ext.VPxNode_copyInternalData,
+            floor.copyInternalData, pb.VPxNode.copyInternalData, ('a',), node, p_node),
+        row('string', None, 'setCommandString', _ext.VPxCommand_setCommandString,
+            floor.setCommandString, pb.VPxCommand.setCommandString, (text,), cmd, p_cmd),
+        row('status result', None, 'setVersion', _ext.VFnPlugin_setVersion, floor.setVersion,
+            pb.VFnPlugin.setVersion, ('"1.2"',), plugin, p_plugin),
+    ], (floor, node, cmd, plugin)
+
+
+def timer(statement, names):
+    # The names become locals of the timing function, as in real call sites.
+    setup = '\n'.join(f'{k} = _names[{k!r}]' for k in names)
+    return timeit.Timer(statement, setup, globals={'_names': names})
+
+
+def check(rows, floor, node, cmd, plugin):
+    """Every variant returns what the host call should, and the floor really
+    checks its arguments' types; a wrong result would make its timing moot."""
+    for label, expected, variants in rows:
+        for variant, (statement, names) in variants.items():
+            got = eval(statement, dict(names))
+            if got != expected:
+                sys.exit(f'{label}/{variant}: {statement} returned {got!r}, not {expected!r}')
+    if cmd.commandString() != 'polyCube -w 2' or plugin.version() != '1.2':
+        sys.exit('the host calls did not take effect')
+    for call in (lambda: floor.isAbstractClass(cmd), lambda: floor.copyInternalData(node, cmd),
+                 lambda: floor.setCommandString(cmd, 5), lambda: floor.setVersion(node, '1')):
+        try:
+            call()
+        except TypeError:
+            continue
+        sys.exit('a floor function took an argument of the wrong type')
+
+
+def measure(rows, number, rounds):
+    """Median ns per call of every variant, and medians of the per-round
+    ratios. The machine's speed drifts by up to half in phases of milliseconds
+    to seconds; a row's variants, run a few milliseconds apart, share one."""
+    empty = timer('pass', {})
+    timers = [(label, {v: timer(*variants[v]) for v in VARIANTS}) for label, _, variants in rows]
+    samples = {}
+    for r in range(rounds):
+        samples.setdefault(('empty', ''), []).append(empty.timeit(number) / number * 1e9)
+        for i in range(len(timers)):
+            label, row_timers = timers[(i + r) % len(timers)]
+            order = VARIANTS[r % len(VARIANTS):] + VARIANTS[:r % len(VARIANTS)]
+            t = {v: row_timers[v].timeit(number) / number * 1e9 for v in order}
+            for v in VARIANTS:
+                samples.setdefault((label, v), []).append(t[v])
+            for name, value in (('/floor', t['generated'] / t['floor']),
+                                ('pybind/', t['pybind'] / t['generated']),
+                                ('pybind/floor', t['pybind'] / t['floor']),
+                                ('proxy/fwd', t['proxy'] / min(t['def'], t['builtin']))):
+                samples.setdefault((label, name), []).append(value)
+    return {key: statistics.median(values) for key, values in samples.items()}
+
+
+def report(rows, m, number, rounds):
+    print(f'Python {platform.python_version()}: {number} calls per sample, median of {rounds} '
+          f'rounds; ns per call, loop included (empty loop {m["empty", ""]:.1f} ns); ratios are '
+          f'medians of per-round ratios\n')
+    head = ('row', 'generated', 'floor', 'ratio', 'pybind11', 'speedup', 'proxy', 'def fwd',
+            'builtin fwd')
+    print(f'{head[0]:<18}' + ''.join(f'{h:>12}' for h in head[1:]))
+    for label, _, _ in rows:
+        t = {v: m[label, v] for v in VARIANTS}
+        print(f'{label:<18}{t["generated"]:12.1f}{t["floor"]:12.1f}{m[label, "/floor"]:11.2f}x'
+              f'{t["pybind"]:12.1f}{m[label, "pybind/"]:11.2f}x{t["proxy"]:12.1f}{t["def"]:12.1f}'
+              f'{t["builtin"]:12.1f}')
+
+    def goal(text, key, fails, fmt):
+        misses = [label for label, _, _ in rows if fails(m[label, key])]
+        values = ', '.join(f'{label} {fmt(m[label, key])}' for label, _, _ in rows)
+        print(f'{text}: {"not met on " + ", ".join(misses) if misses else "met"} ({values})')
+
+    print()
+    goal(f'generated within {FLOOR_LIMIT:.2f}x of the floor', '/floor',
+         lambda r: r > FLOOR_LIMIT, lambda r: f'{r:.2f}x')
+    goal(f'at least {PYBIND_SPEEDUP}x faster than pybind11', 'pybind/',
+         lambda r: r < PYBIND_SPEEDUP, lambda r: f'{r:.2f}x')
+    # The bound that the conversions and the host call leave to any binding.
+    print('  for reference, the floor against pybind11: '
+          + ', '.join(f'{label} {m[label, "pybind/floor"]:.2f}x' for label, _, _ in rows))
+    goal(f'proxy no slower than the faster forwarder (a tie within {PROXY_NOISE:.0%})', 'proxy/fwd',
+         lambda r: r > 1 + PROXY_NOISE, lambda r: f'{r - 1:+.1%}')
+
+
+def main():
+    parser = argparse.ArgumentParser(description=__doc__.splitlines()[0])
+    parser.add_argument('--build', default='build', help='build tree (default: build)')
+    parser.add_argument('--number', type=int, default=50_000, help='calls per sample')
+    parser.add_argument('--rounds', type=int, default=41)
+    args = parser.parse_args()
+    sys.path.insert(0, os.path.join(ROOT, args.build, 'python'))
+    rows, objects = make_rows()
+    check(rows, *objects)
+    report(rows, measure(rows, args.number, args.rounds), args.number, args.rounds)
+
+
+if __name__ == '__main__':
+    main()
