@@ -29,6 +29,11 @@ class Manifest:
     casts: dict[str, list[str]] = field(default_factory=dict)  # target -> sources
     pointer_classes: list[tuple[str, str]] = field(default_factory=list)  # (class, scalar)
     functions: list[str] = field(default_factory=list)  # hand-written, no arguments
+    # The host function announcing that a Python callable stands where it
+    # expects a function pointer; called once per callable passed.
+    callable_announcement: str = ''
+    skip: list[str] = field(default_factory=list)        # "Class::member" not wrapped
+    handwritten: dict[str, list[str]] = field(default_factory=dict)  # class -> members in wrap/
     source: str = ''               # manifest path as given, for banners
 
 
@@ -58,6 +63,9 @@ def load(path: str, display_name: str | None = None) -> Manifest:
             casts={k: list(v) for k, v in data.get('casts', {}).items()},
             pointer_classes=[(p['name'], p['type']) for p in mod.get('pointer_classes', [])],
             functions=list(mod.get('functions', [])),
+            callable_announcement=mod.get('callable_announcement', ''),
+            skip=list(mod.get('skip', [])),
+            handwritten={k: list(v) for k, v in data.get('handwritten', {}).items()},
             source=display_name or path)
     except KeyError as e:
         raise ManifestError(f'{path}: missing key {e}') from None

@@ -91,3 +91,18 @@ inline int RefuseVariable(const char *message) {
 }
 
 }  // namespace swigrt
+
+namespace swigrt {
+
+// A Python object passed where the host expects a function pointer: the host
+// is told, once per callable, just before it is handed over, and takes the
+// reference added here. An absent optional callable is neither.
+template <class F>
+F CallableArg(PyObject *obj, void (*announce)()) {
+  if (!obj) return nullptr;
+  Py_INCREF(obj);
+  announce();
+  return reinterpret_cast<F>(obj);
+}
+
+}  // namespace swigrt

@@ -30,6 +30,9 @@ def _convert(a: Arg) -> str:
                     f'{c_string(a.message)})')
         return f'  void *argp{n} = nullptr;\n  if ({present}!{call}) return nullptr;\n'
     if a.kind == 'string':
+        if a.default:
+            return (f'  VString arg{n} = {a.default};\n'
+                    f'  if ({slot}) swigrt::StringArg({slot}, arg{n}, {c_string(a.message)});\n')
         return f'  VString arg{n};\n  swigrt::StringArg({slot}, arg{n}, {c_string(a.message)});\n'
     if a.kind == 'string_array':
         return (f'  VStringArray arg{n};\n'
@@ -49,6 +52,10 @@ def _convert(a: Arg) -> str:
         return out
     if a.kind == 'status_out':
         return f'  VStatus status{n};\n'
+    if a.kind == 'callable':
+        return (f'  // The Python object itself stands for the function: one reference\n'
+                f'  // and the announcement go to the host with it.\n'
+                f'  {a.cpp} arg{n} = swigrt::CallableArg<{a.cpp}>({slot}, {a.announce});\n')
     if a.kind == 'pyobject':
         return ''
     raise AssertionError(a.kind)
@@ -65,13 +72,22 @@ def _value(a: Arg) -> str:
         'string_ptr': lambda: f'has{n} ? &arg{n} : nullptr',
         'chars': lambda: f'arg{n}.ptr',
         'status_out': lambda: f'&status{n}',
+        'callable': lambda: f'arg{n}',
         'pyobject': lambda: _slot(a),
     }[a.kind]()
 
 
 def _check(a: Arg) -> str:
-    """A check-only conversion for an overload dispatcher."""
+    """A check-only conversion for an overload dispatcher; an optional
+    argument that is absent passes."""
+    test = _check_present(a)
+    return f'(!{_slot(a)} || {test})' if a.optional else test
+
+
+def _check_present(a: Arg) -> str:
     slot = _slot(a)
+    if a.kind == 'callable':
+        return f'PyCallable_Check({slot})'
     if a.kind == 'scalar':
         return f'SWIG_IsOK(swigrt::{a.converter}({slot}, nullptr))'
     if a.kind == 'object':
@@ -258,7 +274,7 @@ def _class(cls: WrappedClass) -> str:
                f'  if (!swigrt::PointerArg(arg, {d}, SWIG_POINTER_DISOWN, &argp1, {msg})) '
                'return nullptr;\n'
                f'  delete static_cast<{cls.name} *>(argp1);\n  Py_RETURN_NONE;\n}}\n\n')
-    out += [entry_point(cls.name, m) + '\n' for m in cls.members]
+    out += [entry_point(cls.name, m) + '\n' for m in cls.members if m.candidates]
     if cls.director:
         msg = c_string(f"in method 'disown_{cls.name}', argument 1 of type '{cls.name} *'")
         out.append(f'PyObject *wrap_disown_{cls.name}(PyObject *, PyObject *arg) {{\n'

@@ -83,7 +83,8 @@ class Builder:
             args.append(conversions.self_argument(cls, entry, fn.const, self.class_descriptor(cls)))
         slot = first - 1
         for j, p in enumerate(fn.params):
-            arg = conversions.argument(first + j, slot, p, entry, self.descriptor_for)
+            arg = conversions.argument(first + j, slot, p, entry, self.descriptor_for,
+                                       self.m.callable_announcement, cls)
             if arg.slot is not None:
                 slot += 1
             args.append(arg)
@@ -143,6 +144,8 @@ class Builder:
             if fn.name.startswith('operator') or not (
                     fn.access == 'public' or (director and fn.access == 'protected')):
                 continue
+            if f'{cls.name}::{fn.name}' in self.m.skip:
+                continue
             groups.setdefault(fn.name, []).append(fn)
         out = []
         for name, fns in groups.items():
@@ -156,6 +159,10 @@ class Builder:
                 c.virtual, c.pure = director and fn.virtual, fn.pure
                 c.protected, c.owner = fn.access == 'protected', cls.name
             out.append(ep)
+        for name in self.m.handwritten.get(cls.name, []):
+            # Written in wrap/: only its place in the table and the proxy class.
+            out.append(EntryPoint(f'{cls.name}_{name}', f'wrap_{cls.name}_{name}', METH_VARARGS,
+                                  [], member=name))
         return out
 
     def virtual_set(self, name: str) -> list[tuple[str, Function]]:

@@ -52,8 +52,14 @@ def _scalar_default(t: CType, text: str) -> str | None:
     return None
 
 
+def _function_pointer(t: CType) -> bool:
+    while t.kind == 'typedef':
+        t = t.inner
+    return t.kind == 'pointer' and t.inner.kind == 'function'
+
+
 def argument(number: int, slot: int | None, p: Param, entry: str,
-             descriptor_for: DescriptorFor) -> Arg:
+             descriptor_for: DescriptorFor, announce: str = '', scope: str = '') -> Arg:
     """How parameter `p`, argument `number` of `entry`, is filled."""
     t = p.type
     declared = spell(t)
@@ -75,6 +81,13 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
         return 'nullptr'
 
     scalar = _scalar_target(t)
+    if _function_pointer(t):
+        if not announce:
+            raise unsupported()
+        if p.default is not None and p.default not in _NULL_DEFAULTS:
+            raise unsupported()
+        return Arg(number, slot, declared, 'callable', declared,
+                   default='nullptr' if p.default is not None else None, announce=announce)
     if scalar.kind == 'enum' or (scalar.kind == 'builtin' and scalar.name in SCALAR_CONVERTERS):
         s = spell(unqualified(t))
         default = None
@@ -91,13 +104,18 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
     string_like = t if t.kind == 'record' else inner if t.kind == 'lvref' else None
     if string_like is not None and string_like.kind == 'record' and \
             string_like.name in (STRING, STRING_ARRAY):
-        if p.default is not None:
-            raise unsupported()
         output = t.kind == 'lvref' and not string_like.const
+        if p.default is not None and (output or string_like.name != STRING):
+            raise unsupported()
         if string_like.name == STRING:
             if output:
                 raise unsupported()
-            return Arg(number, slot, spell(t), 'string',
+            default = None
+            if p.default is not None:
+                # A literal, or a static of the member's class.
+                default = p.default if p.default.startswith('"') else (
+                    p.default if '::' in p.default or not scope else f'{scope}::{p.default}')
+            return Arg(number, slot, spell(t), 'string', default=default,
                        message=f'Expected a String or Unicode object for argument {number}')
         return Arg(number, slot, spell(t), 'string_array',
                    message=f'Expected a list of Strings or Unicode objects for argument {number}',

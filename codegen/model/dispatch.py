@@ -5,7 +5,8 @@ from .records import Arg, Candidate, DispatchRule
 from .naming import GeneratorError
 
 # Argument kinds a dispatcher can test without converting for real.
-TESTABLE = frozenset({'scalar', 'object', 'string', 'string_array', 'string_ptr', 'chars'})
+TESTABLE = frozenset({'scalar', 'object', 'string', 'string_array', 'string_ptr', 'chars',
+                      'callable'})
 
 
 def dispatch_rules(cands: list[Candidate]) -> list[DispatchRule]:

@@ -37,7 +37,8 @@ class Arg:
 
     kind: scalar, object (a wrapped pointer), string, string_array, string_ptr
     (an optional `VString const *`), chars (`char const *`), status_out (a
-    `VStatus *` the wrapper owns), pyobject (passed through)."""
+    `VStatus *` the wrapper owns), pyobject (passed through), callable (a
+    Python object standing for a function pointer, referenced and announced)."""
     number: int                  # position in messages, counted from 1 with self
     slot: int | None             # index in the Python arguments; None when not from Python
     spelling: str
@@ -53,6 +54,7 @@ class Arg:
     output: bool = False         # string_array: the list is rewritten after the call
     list_messages: tuple[str, str] = ('', '')   # not a list, cannot modify
     is_self: bool = False        # `self` of a member call
+    announce: str = ''           # callable: the host function announcing it
 
     @property
     def optional(self) -> bool:
