@@ -95,6 +95,11 @@ def _join(tokens: list[str]) -> str:
     return re.sub(r'^([-+])\s+', r'\1', text)
 
 
+def _deleted(cursor) -> bool:
+    tokens = [t.spelling for t in cursor.get_tokens()]
+    return tokens[-2:] == ['=', 'delete'] or tokens[-3:-1] == ['=', 'delete']
+
+
 def _access(cursor) -> str:
     spec = cursor.access_specifier
     if spec == ci.AccessSpecifier.PROTECTED:
@@ -186,6 +191,8 @@ class _Reader:
         cls = Class(self.qualified(cursor), header, abstract=cursor.is_abstract_record())
         for c in cursor.get_children():
             if c.kind != K.CXX_BASE_SPECIFIER and _access(c) == 'private':
+                continue
+            if c.kind in (K.CONSTRUCTOR, K.CXX_METHOD) and _deleted(c):
                 continue
             if c.kind == K.CXX_BASE_SPECIFIER:
                 cls.bases.append((self.qualified(c.type.get_declaration()), _access(c)))

@@ -228,7 +228,26 @@ def _dispatch_branch(rule: DispatchRule) -> str:
     return f'if ({cond}) {{\n' + ''.join(lines) + '  }'
 
 
+def _comparison(cls: str, ep: EntryPoint) -> str:
+    c = ep.candidates[0]
+    self_arg, other = c.args
+    op = '==' if ep.member == '__eq__' else '!='
+    return (f'PyObject *{ep.function}(PyObject *, PyObject *args) {{\n'
+            '  PyObject *argv[2] = {};\n'
+            f'  if (!swigrt::UnpackTuple(args, {c_string(ep.entry)}, 2, 2, argv)) return nullptr;\n'
+            + _convert(self_arg) +
+            '  // Anything but an object of the class is for Python to compare.\n'
+            '  void *argp2 = nullptr;\n'
+            f'  if (!SWIG_IsOK(swigrt::ConvertPtr(argv[1], &argp2, {other.descriptor.macro}, 0)) || '
+            '!argp2)\n    Py_RETURN_NOTIMPLEMENTED;\n'
+            f'  return PyBool_FromLong(*static_cast<{cls} *>(argp1) {op} '
+            f'*static_cast<{cls} *>(argp2));\n}}\n')
+
+
 def entry_point(cls: str, ep: EntryPoint) -> str:
+    if ep.comparison:
+        return _comparison(cls, ep)
+
     def head(param: str) -> str:
         return f'PyObject *{ep.function}(PyObject *, PyObject *{param}) {{\n'
 

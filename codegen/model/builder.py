@@ -13,6 +13,8 @@ from .records import (METH_NOARGS, METH_O, METH_VARARGS, Candidate, Cast, Compan
 from .naming import GeneratorError, pointer_descriptor_name, spell, unqualified
 
 REFUSE_PLAIN = 'accessing abstract class or protected constructor'
+# Comparison operators of a class with itself, and their Python names.
+COMPARISONS = {'operator==': '__eq__', 'operator!=': '__ne__'}
 OVERLOAD_HEAD = ("Wrong number or type of arguments for overloaded function '{}'.\n"
                  '  Possible C/C++ prototypes are:\n')
 
@@ -128,7 +130,9 @@ class Builder:
                   or (director and c.access == 'protected')]
         if not cls.constructors:
             usable = [Function(cls.name, 'public', [])]
-        usable = [c for c in usable if not _is_copy(c, cls.name)]
+        # A value class is copied from Python; a class Python derives from is not.
+        if director:
+            usable = [c for c in usable if not _is_copy(c, cls.name)]
         entry = f'new_{cls.name}'
         first = 2 if director else 1
         ep = self.entry_point(entry, usable, lambda fn, name: self.candidate(
@@ -141,6 +145,10 @@ class Builder:
         from (open only inside their own override)."""
         groups: dict[str, list[Function]] = {}
         for fn in cls.methods:
+            if fn.name in COMPARISONS and fn.access == 'public' and len(fn.params) == 1 and \
+                    fn.params[0].type.kind == 'lvref' and fn.params[0].type.inner.name == cls.name:
+                groups.setdefault(fn.name, []).append(fn)
+                continue
             if fn.name.startswith('operator') or not (
                     fn.access == 'public' or (director and fn.access == 'protected')):
                 continue
@@ -151,10 +159,12 @@ class Builder:
         for name, fns in groups.items():
             if len({f.static for f in fns}) > 1:
                 raise GeneratorError(f'{cls.name}::{name}: static and instance overloads mixed')
-            entry = f'{cls.name}_{name}'
+            python_name = COMPARISONS.get(name, name)
+            entry = f'{cls.name}_{python_name}'
             ep = self.entry_point(entry, fns, lambda fn, fname: self.candidate(
                 cls.name, fn, entry, fname, 1 if fn.static else 2, ctor=False))
-            ep.member, ep.static = name, fns[0].static
+            ep.member, ep.static = python_name, fns[0].static
+            ep.comparison = name in COMPARISONS
             for c, fn in zip(ep.candidates, fns):
                 c.virtual, c.pure = director and fn.virtual, fn.pure
                 c.protected, c.owner = fn.access == 'protected', cls.name

@@ -112,6 +112,8 @@ class EntryPoint:
     static: bool = False
     takes_self: bool = False      # constructors: argument 1 is the Python object
     refuse_plain: bool = False    # constructors: no plain object may be built
+    comparison: bool = False      # == or !=: an operand that does not convert is
+                                  # not an error but NotImplemented
 
 
 @dataclass

@@ -43,15 +43,6 @@ struct VExternalContentInfoTable::Entries {
 VExternalContentInfoTable::VExternalContentInfoTable() : fEntries(new Entries) {
   standin::noteConstructed("VExternalContentInfoTable");
 }
-VExternalContentInfoTable::VExternalContentInfoTable(const VExternalContentInfoTable &other)
-    : fEntries(new Entries(*other.fEntries)) {
-  standin::noteConstructed("VExternalContentInfoTable");
-}
-VExternalContentInfoTable &VExternalContentInfoTable::operator=(
-    const VExternalContentInfoTable &other) {
-  *fEntries = *other.fEntries;
-  return *this;
-}
 VExternalContentInfoTable::~VExternalContentInfoTable() {
   standin::noteDestroyed("VExternalContentInfoTable");
 }

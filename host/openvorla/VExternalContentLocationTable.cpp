@@ -15,16 +15,6 @@ struct VExternalContentLocationTable::Entries {
 VExternalContentLocationTable::VExternalContentLocationTable() : fEntries(new Entries) {
   standin::noteConstructed("VExternalContentLocationTable");
 }
-VExternalContentLocationTable::VExternalContentLocationTable(
-    const VExternalContentLocationTable &other)
-    : fEntries(new Entries(*other.fEntries)) {
-  standin::noteConstructed("VExternalContentLocationTable");
-}
-VExternalContentLocationTable &VExternalContentLocationTable::operator=(
-    const VExternalContentLocationTable &other) {
-  *fEntries = *other.fEntries;
-  return *this;
-}
 VExternalContentLocationTable::~VExternalContentLocationTable() {
   standin::noteDestroyed("VExternalContentLocationTable");
 }

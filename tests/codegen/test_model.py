@@ -82,8 +82,10 @@ def test_constructor_forms(fixture):
     ctors = {c.name: c.constructor for c in fixture.classes}
     node = ctors['Node']
     assert (node.flags, node.takes_self, node.refuse_plain) == (METH_O, True, False)
+    # A value class keeps its copy constructor; a class Python derives from does not.
     value = ctors['Value']
-    assert (value.flags, value.takes_self) == (METH_NOARGS, False)
+    assert (value.flags, value.takes_self) == (METH_VARARGS, False)
+    assert [c.prototype for c in value.candidates] == ['Value::Value()', 'Value::Value(Value const &)']
     # An abstract class and a protected constructor refuse the plain object.
     assert ctors['Abstract'].refuse_plain and ctors['Hidden'].refuse_plain
 
@@ -136,7 +138,7 @@ def test_method_table_order_and_flags(fixture):
                           ('Node_pick', METH_VARARGS), ('disown_Node', METH_O),
                           ('Node_swigregister', METH_O)]
     # No director: no disown entry.
-    assert rows[-4:] == [('new_Value', METH_NOARGS), ('delete_Value', METH_O),
+    assert rows[-4:] == [('new_Value', METH_VARARGS), ('delete_Value', METH_O),
                          ('Value_swigregister', METH_O), ('Value_swiginit', METH_VARARGS)]
 
 

@@ -15,8 +15,8 @@ OPENVORLA_NAMESPACE_OPEN
 class OPENVORLA_EXPORT VExternalContentInfoTable {
 public:
   VExternalContentInfoTable();
-  VExternalContentInfoTable(const VExternalContentInfoTable &other);
-  VExternalContentInfoTable &operator=(const VExternalContentInfoTable &other);
+  VExternalContentInfoTable(const VExternalContentInfoTable &) = delete;
+  VExternalContentInfoTable &operator=(const VExternalContentInfoTable &) = delete;
   ~VExternalContentInfoTable();
 
   VStatus addResolvedEntry(const VString &key, const VString &unresolvedLocation,

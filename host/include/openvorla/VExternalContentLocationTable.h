@@ -12,8 +12,8 @@ OPENVORLA_NAMESPACE_OPEN
 class OPENVORLA_EXPORT VExternalContentLocationTable {
 public:
   VExternalContentLocationTable();
-  VExternalContentLocationTable(const VExternalContentLocationTable &other);
-  VExternalContentLocationTable &operator=(const VExternalContentLocationTable &other);
+  VExternalContentLocationTable(const VExternalContentLocationTable &) = delete;
+  VExternalContentLocationTable &operator=(const VExternalContentLocationTable &) = delete;
   ~VExternalContentLocationTable();
 
   VStatus addEntry(const VString &key, const VString &location);

@@ -371,9 +371,32 @@ PyObject *wrap_Pair_swigregister(PyObject *, PyObject *args) {
 
 // Value
 
-PyObject *wrap_new_Value(PyObject *, PyObject *) {
+static PyObject *wrap_new_Value_1(Py_ssize_t argc, [[maybe_unused]] PyObject **argv) {
+  if (argc != 0) return nullptr;
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Value(), SWIGTYPE_p_Value, SWIG_POINTER_NEW);
   return resultobj;
+}
+
+static PyObject *wrap_new_Value_2(Py_ssize_t argc, PyObject **argv) {
+  if (argc != 1) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Value, &argp1, "in method 'new_Value', argument 1 of type 'Value const &'", "invalid null reference in method 'new_Value', argument 1 of type 'Value const &'")) return nullptr;
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Value(*static_cast<Value const *>(argp1)), SWIGTYPE_p_Value, SWIG_POINTER_NEW);
+  return resultobj;
+}
+
+PyObject *wrap_new_Value(PyObject *, PyObject *args) {
+  PyObject *argv[1] = {};
+  Py_ssize_t argc = swigrt::UnpackTuple(args, "new_Value", 0, 1, argv) - 1;
+  PyObject *result = nullptr;
+  if (argc == 0) {
+    result = wrap_new_Value_1(argc, argv);
+  } else if (argc == 1) {
+    result = wrap_new_Value_2(argc, argv);
+  }
+  if (!swigrt::DispatchFailed(result)) return result;
+  swigrt::RaiseOrModifyTypeError("Wrong number or type of arguments for overloaded function 'new_Value'.\n  Possible C/C++ prototypes are:\n    Value::Value()\n    Value::Value(Value const &)\n");
+  return nullptr;
 }
 
 PyObject *wrap_delete_Value(PyObject *, PyObject *arg) {
