@@ -26,6 +26,11 @@ def dispatch_rules(cands: list[Candidate]) -> list[DispatchRule]:
         else:
             rules.append(DispatchRule((argc, argc), group))
     for rule in rules:
+        # A candidate whose only difference is an argument any object passes
+        # (a bool) would take every call: it is tried last, without a test.
+        others = [c for c in rule.candidates]
+        rule.candidates = sorted(
+            others, key=lambda c: not _discriminates_or_none(_first_difference(c, others)))
         for i, c in enumerate(rule.candidates):
             if i == len(rule.candidates) - 1:
                 rule.tests.append(None)
@@ -35,6 +40,10 @@ def dispatch_rules(cands: list[Candidate]) -> list[DispatchRule]:
                 raise GeneratorError(f'{c.prototype}: no argument tells it apart')
             rule.tests.append(test)
     return rules
+
+
+def _discriminates_or_none(a: Arg | None) -> bool:
+    return a is None or _discriminates(a)
 
 
 def _python_args(c: Candidate) -> list[Arg]:

@@ -1,10 +1,12 @@
-// VFnPlugin: the table of loaded plug-ins and the plain members of the
-// registration function set.
+// VFnPlugin: the table of loaded plug-ins and the registration function set.
 #include <openvorla/VFnPlugin.h>
+
+#include "PluginRegistry.h"
 
 #include <standin/Lifetime.h>
 #include <standin/Objects.h>
 #include <standin/Plugins.h>
+#include <standin/Registry.h>
 
 #include <algorithm>
 #include <atomic>
@@ -36,8 +38,6 @@ struct PluginRecord {
   VString loadPath;
   std::vector<MenuItem> menuItems;
   std::vector<VString> displayFilters;
-  std::vector<VString> nodeTypes;                      // filled by node registration
-  std::vector<std::pair<VTypeId, VTypeId>> matrixIds;  // transform type -> matrix type
   PyObject *uiProcs[4] = {nullptr, nullptr, nullptr, nullptr};
   VPluginCallableInfo *callableInfo = nullptr;
 };
@@ -93,6 +93,7 @@ PluginTable &plugins() {
 }
 
 std::atomic<bool> gRegisteringCallableScript{false};
+std::atomic<long> gAnnouncements{0};
 
 VStatus notAttached() {
   return VStatus(VStatus::kFailure, "The function set is not attached to a loaded plug-in");
@@ -184,22 +185,11 @@ VObject VFnPlugin::findPlugin(const VString &pluginName) {
 }
 
 bool VFnPlugin::isNodeRegistered(const VString &typeName) {
-  PluginTable &table = plugins();
-  std::lock_guard<std::mutex> guard(table.mutex);
-  for (auto &r : table.records)
-    if (std::find(r->nodeTypes.begin(), r->nodeTypes.end(), typeName) != r->nodeTypes.end())
-      return true;
-  return false;
+  return registry::isNodeRegistered(typeName);
 }
 
 VTypeId VFnPlugin::matrixTypeIdFromXformId(const VTypeId &xformTypeId) {
-  PluginTable &table = plugins();
-  std::lock_guard<std::mutex> guard(table.mutex);
-  PluginRecord *record = table.find(object());
-  if (record)
-    for (const auto &ids : record->matrixIds)
-      if (ids.first == xformTypeId) return ids.second;
-  return VTypeId();
+  return VTypeId(registry::matrixTypeId(object(), xformTypeId.id()));
 }
 
 VStringArray VFnPlugin::addMenuItem(const VString &menuItemName, const VString &parentName,
@@ -312,7 +302,24 @@ VStatus VFnPlugin::registerDisplayFilter(const VString &filterName, const VStrin
   return VStatus::kSuccess;
 }
 
-void VFnPlugin::setRegisteringCallableScript() { gRegisteringCallableScript.store(true); }
+VStatus VFnPlugin::deregisterDisplayFilter(const VString &filterName) {
+  PluginTable &table = plugins();
+  std::lock_guard<std::mutex> guard(table.mutex);
+  PluginRecord *record = table.find(object());
+  if (!record) return notAttached();
+  auto &filters = record->displayFilters;
+  auto it = std::find(filters.begin(), filters.end(), filterName);
+  if (it == filters.end())
+    return VStatus(VStatus::kFailure,
+                   VString("The plug-in has no display filter named '") + filterName + "'");
+  filters.erase(it);
+  return VStatus::kSuccess;
+}
+
+void VFnPlugin::setRegisteringCallableScript() {
+  ++gAnnouncements;
+  gRegisteringCallableScript.store(true);
+}
 bool VFnPlugin::registeringCallableScript() { return gRegisteringCallableScript.exchange(false); }
 
 void VFnPlugin::setCallableInfo(VPluginCallableInfo *info) {
@@ -329,6 +336,30 @@ VPluginCallableInfo *VFnPlugin::getCallableInfo() {
 }
 
 const char *VFnPlugin::className() { return "VFnPlugin"; }
+
+VString pluginName(const VObject &plugin) { return readField(plugin, &PluginRecord::name); }
+
+// The plug-in table's lock is held while the registry changes, so that a
+// plug-in being unloaded gains no registration on the way. A refused
+// registration dies with the parameter and a removed one with `released`,
+// both after the locks are given up.
+VStatus submitRegistration(const VObject &plugin, RegistrationPtr registration) {
+  Released released;
+  PluginTable &table = plugins();
+  std::lock_guard<std::mutex> guard(table.mutex);
+  if (!table.find(plugin)) return notAttached();
+  registration->plugin = plugin;
+  return registry::add(registration, released);
+}
+
+VStatus withdrawRegistration(const VObject &plugin,
+                             const std::function<VStatus(Released &)> &remove) {
+  Released released;
+  PluginTable &table = plugins();
+  std::lock_guard<std::mutex> guard(table.mutex);
+  if (!table.find(plugin)) return notAttached();
+  return remove(released);
+}
 
 const VString VFnPlugin::kDefaultDataLocation("default");
 
@@ -347,18 +378,25 @@ VObject loadPlugin(const char *name, const char *loadPath) {
 }
 
 void unloadPlugin(const VObject &plugin) {
+  Released released;  // released last, with no lock held
   PluginTable &table = plugins();
   std::lock_guard<std::mutex> guard(table.mutex);
   auto &records = table.records;
   records.erase(std::remove_if(records.begin(), records.end(),
                                [&plugin](const auto &r) { return r->object == plugin; }),
                 records.end());
+  registry::removeAll(plugin, released);
 }
 
 void unloadAllPlugins() {
+  Released released;
   PluginTable &table = plugins();
   std::lock_guard<std::mutex> guard(table.mutex);
   table.records.clear();
+  registry::clear(released);
 }
+
+long announcements() { return gAnnouncements.load(); }
+void resetAnnouncements() { gAnnouncements.store(0); }
 
 }  // namespace standin

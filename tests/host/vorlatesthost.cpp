@@ -10,6 +10,7 @@
 
 #include "director.h"
 #include "host_calls.h"
+#include "registry_hooks.h"
 #include "swigrt.h"
 #include "text.h"
 
@@ -420,6 +421,14 @@ PyMethodDef methods[] = {
     {"host_delete", host_delete, METH_VARARGS, "The host deletes an object it owns."},
     {"log_entries", log_entries, METH_NOARGS, "The application's log."},
     {"clear_log", clear_log, METH_NOARGS, "Empties the application's log."},
+    {"registrations", registrations, METH_NOARGS, "What the host's registry recorded."},
+    {"announcements", announcements, METH_NOARGS, "Callables announced since the reset."},
+    {"reset_announcements", reset_announcements, METH_NOARGS, "Counts announcements anew."},
+    {"initialize_node", initialize_node, METH_O, "Runs a node type's initializer: status code."},
+    {"create_node", create_node, METH_O, "A node made through its registered creator."},
+    {"create_command", create_command, METH_O, "A command made through its creator."},
+    {"delete_node", delete_node, METH_O, "The host deletes a node it made."},
+    {"delete_command", delete_command, METH_O, "The host deletes a command it made."},
     {"alive", counter<standin::aliveCount>, METH_O, "Host objects of a class alive now."},
     {"constructed", counter<standin::constructedCount>, METH_O, "Host objects constructed."},
     {"destroyed", counter<standin::destroyedCount>, METH_O, "Host objects destroyed."},

@@ -66,6 +66,7 @@
 #include <standin/Nodes.h>
 #include <standin/Objects.h>
 #include <standin/Plugins.h>
+#include <standin/Registry.h>
 
 #include <climits>
 #include <cmath>
@@ -1021,6 +1022,275 @@ class NotingFilter : public VPxVorlaAsciiFilter {
   VString seenFile;
 };
 
+// A C++ plug-in's classes and callbacks, as the registry makes and calls them.
+int gInitializations = 0;
+void *makeNode() { return new CountingNode; }
+void *makeNothing() { return nullptr; }
+void *makeCommand() { return new VPxCommand; }
+void *makeData() { return new PlainGeometry; }
+VStatus initNode() {
+  ++gInitializations;
+  // The host starts the type's declarations afresh before its initializer.
+  return standin::nodeTypeAttributeCount() == 0 ? VStatus::kSuccess : VStatus::kFailure;
+}
+VSyntax makeSyntax() { return VSyntax(); }
+VPxTransformationMatrix *makeMatrix() { return new VPxTransformationMatrix; }
+
+const standin::RegistrationInfo *findRegistration(const std::vector<standin::RegistrationInfo> &all,
+                                                  const char *name) {
+  for (const standin::RegistrationInfo &r : all)
+    if (r.name == name) return &r;
+  return nullptr;
+}
+
+void testRegistry() {
+  standin::unloadAllPlugins();
+  VObject rigObject = standin::loadPlugin("rig", "/plug-ins/rig");
+  VObject meshObject = standin::loadPlugin("mesh", "/plug-ins/mesh");
+  VFnPlugin rig(rigObject), mesh(meshObject);
+
+  CHECK(rig.registerNode("rigNode", VTypeId(0x100), makeNode, initNode));
+  CHECK(VFnPlugin::isNodeRegistered("rigNode") && !VFnPlugin::isNodeRegistered("meshNode"));
+  VStatus status = mesh.registerNode("rigNode", VTypeId(0x101), makeNode, initNode);
+  CHECK(status == VStatus::kFailure &&
+        status.errorString() == "The name 'rigNode' is in use by the node type 'rigNode'");
+  // Node and data types share their names and type ids.
+  status = mesh.registerData("meshData", VTypeId(0x100), makeData);
+  CHECK(status == VStatus::kFailure &&
+        status.errorString() == "The type id 0x100 is in use by the node type 'rigNode'");
+  CHECK(mesh.registerData("meshData", VTypeId(0x102), makeData, VPxData::kGeometryData));
+  status = mesh.registerNode("", VTypeId(0x103), makeNode, initNode);
+  CHECK(status == VStatus::kInvalidParameter && status.errorString() == "A node type needs a name");
+  status = mesh.registerNode("meshNode", VTypeId(0x103), makeNode, nullptr);
+  CHECK(status == VStatus::kInvalidParameter &&
+        status.errorString() == "The node type 'meshNode' needs an initializer");
+  CHECK(mesh.registerNode("meshNode", VTypeId(), makeNode, initNode) == VStatus::kInvalidParameter);
+  CHECK(rig.registerTransform("rigXform", VTypeId(0x104), makeNode, initNode, makeMatrix,
+                              VTypeId(0x105)));
+  CHECK(mesh.registerShape("meshShape", VTypeId(0x106), makeNode, initNode));
+  CHECK(rig.matrixTypeIdFromXformId(VTypeId(0x104)) == VTypeId(0x105) &&
+        mesh.matrixTypeIdFromXformId(VTypeId(0x104)) == VTypeId());
+
+  // Commands of every kind share names, a context's tool command included.
+  CHECK(rig.registerCommand("rigCmd", makeCommand, makeSyntax));
+  CHECK(rig.registerContextCommand("rigCtx", makeNothing, "rigTool", makeCommand, nullptr));
+  status = mesh.registerControlCommand("rigTool", makeNothing);
+  CHECK(status == VStatus::kFailure &&
+        status.errorString() == "The name 'rigTool' is in use by the context command 'rigCtx'");
+  status = mesh.registerContextCommand("meshCtx", makeNothing, "rigCmd", makeCommand, nullptr);
+  CHECK(status.errorString() == "The name 'rigCmd' is in use by the command 'rigCmd'");
+  CHECK(mesh.registerContextCommand("meshCtx", makeNothing, "meshTool", nullptr, nullptr) ==
+        VStatus::kInvalidParameter);
+  // Kinds outside the shared namespaces keep their own; ids unique among their kind.
+  CHECK(rig.registerDevice("rigCmd", makeNothing) &&
+        rig.registerEvaluator("e", 7, nullptr) == VStatus::kInvalidParameter);
+  CHECK(rig.registerAnimCurveInterpolator("smooth", 3, makeNothing));
+  CHECK(mesh.registerAnimCurveInterpolator("steps", 3, makeNothing) == VStatus::kFailure);
+
+  auto all = standin::registrations();
+  const standin::RegistrationInfo *ctx = findRegistration(all, "rigCtx");
+  CHECK(all.size() == 8 && ctx && ctx->kind == "ContextCommand" && ctx->plugin == "rig" &&
+        ctx->secondName == "rigTool" && ctx->scriptCallables() == 0);
+  // In argument order, the absent syntax creator left out.
+  CHECK(ctx && ctx->callbacks.size() == 2 && ctx->callbacks[1].role == "tool command creator" &&
+        !ctx->callbacks[1].script);
+  const standin::RegistrationInfo *data = findRegistration(all, "meshData");
+  CHECK(data && data->typeId == 0x102 && data->flags == VPxData::kGeometryData);
+  CHECK(mesh.setName("meshTools") &&
+        findRegistration(standin::registrations(), "meshData")->plugin == "meshTools");
+
+  // The application makes instances through the registered creators.
+  standin::resetCounts();
+  VPxNode *node = standin::createNode("rigXform");
+  CHECK(node && node->typeName() == "rigXform" && node->typeId() == VTypeId(0x104));
+  CHECK(node && node->thisVObject().apiType() == VFn::kTransform);
+  standin::deleteNode(node);
+  CHECK(standin::constructedCount("VPxNode") == 1 && standin::aliveCount("VPxNode") == 0);
+  standin::beginNodeType();
+  CHECK(VPxNode::addAttribute(standin::makeAttribute("leftOver")));
+  gInitializations = 0;
+  CHECK(standin::initializeNode("meshShape") && gInitializations == 1);
+  CHECK(standin::initializeNode("meshData") == VStatus::kInvalidParameter);
+  VPxCommand *command = standin::createCommand("rigTool");
+  CHECK(command && standin::aliveCount("VPxCommand") == 1 && !standin::createCommand("rigCtx"));
+  standin::deleteCommand(command);
+  VPxData *made = standin::createData(VTypeId(0x102));
+  CHECK(made && made->name() == "plainGeometry" && !standin::createData(VTypeId(0x100)));
+  standin::deleteData(made);
+  CHECK(standin::aliveCount("VPxData") == 0);
+
+  // Only the plug-in that registered something deregisters it, by its own kind.
+  status = mesh.deregisterNode(VTypeId(0x100));
+  CHECK(status == VStatus::kFailure &&
+        status.errorString() == "The node type 'rigNode' was registered by another plug-in");
+  status = rig.deregisterCommand("rigCtx");
+  CHECK(status == VStatus::kInvalidParameter &&
+        status.errorString() == "The context command 'rigCtx' is not a command");
+  status = rig.deregisterNode(VTypeId(0x102));
+  CHECK(status.errorString() == "The data type 'meshData' is not a node type");
+  status = rig.deregisterCommand("nothing");
+  CHECK(status == VStatus::kFailure &&
+        status.errorString() == "No command named 'nothing' is registered");
+  CHECK(rig.deregisterContextCommand("rigCtx", "otherTool") == VStatus::kInvalidParameter);
+  CHECK(rig.deregisterContextCommand("rigCtx", "rigTool") && !standin::createCommand("rigTool"));
+  CHECK(mesh.registerControlCommand("rigTool", makeNothing));
+  CHECK(mesh.deregisterNode(VTypeId(0x106)) && !VFnPlugin::isNodeRegistered("meshShape"));
+  CHECK(rig.deregisterNode(VTypeId(0x106)) == VStatus::kFailure);
+
+  // A render pass implementation replaces another only when asked to.
+  CHECK(rig.registerRenderPassImpl("beauty", nullptr, makeNothing));
+  CHECK(mesh.registerRenderPassImpl("beauty", nullptr, makeNothing) == VStatus::kFailure);
+  CHECK(mesh.registerRenderPassImpl("beauty", nullptr, makeNothing, true));
+  all = standin::registrations();
+  CHECK(findRegistration(all, "beauty")->plugin == "meshTools");
+
+  VStringArray extensions;
+  CHECK(rig.registerImageFile("pic", makeNothing, extensions) == VStatus::kInvalidParameter);
+  extensions.append("pic");
+  CHECK(rig.registerImageFile("pic", makeNothing, extensions));
+  CHECK(findRegistration(standin::registrations(), "pic")->flags == 10);
+  CHECK(rig.registerFileTranslator("rigFile", nullptr, makeNothing));
+  CHECK(findRegistration(standin::registrations(), "rigFile")->secondName == "default");
+  CHECK(rig.registerUIStrings(initNode, "rigStrings") &&
+        rig.registerUIStrings(initNode, "more") == VStatus::kFailure);
+
+  // Unloading takes a plug-in's registrations with it and frees their names.
+  standin::unloadPlugin(rigObject);
+  all = standin::registrations();
+  for (const standin::RegistrationInfo &r : all) CHECK(r.plugin == "meshTools");
+  CHECK(!VFnPlugin::isNodeRegistered("rigNode") && !standin::createNode("rigNode"));
+  CHECK(mesh.registerNode("rigNode", VTypeId(0x100), makeNode, initNode));
+  CHECK(rig.registerCommand("again", makeCommand) == VStatus::kFailure);  // not loaded
+
+  // Every announcement counts, and a registration takes the flag back.
+  standin::resetAnnouncements();
+  VFnPlugin::setRegisteringCallableScript();
+  VFnPlugin::setRegisteringCallableScript();
+  CHECK(standin::announcements() == 2);
+  CHECK(rig.registerCommand("", nullptr) == VStatus::kFailure &&  // refused, flag read all the same
+        !VFnPlugin::registeringCallableScript());
+  standin::resetAnnouncements();
+  CHECK(standin::announcements() == 0);
+  standin::unloadAllPlugins();
+  CHECK(standin::registrations().empty());
+}
+
+// A Python plug-in's side of registration, played without the binding: the
+// test adds the reference and makes the announcement that the binding makes,
+// and stands in for proxy instances with objects whose "this" converts to the
+// address of a C++ node.
+const char *kScriptPlugin = R"(
+disowned = []
+initialized = []
+
+class Proxy:
+    def __init__(self, address):
+        self.this = address
+    def __disown__(self):
+        disowned.append(self)
+        return self
+
+def creator():
+    return Proxy(address)
+
+def initializer():
+    initialized.append(True)
+
+def broken():
+    raise ValueError('no node today')
+
+def nothing():
+    return None
+)";
+
+// What the binding does with a callable before passing it: under the lock.
+template <typename Function>
+Function announced(PyObject *callable) {
+  Py_INCREF(callable);
+  VFnPlugin::setRegisteringCallableScript();
+  return reinterpret_cast<Function>(callable);
+}
+
+void testScriptCallables() {
+  standin::unloadAllPlugins();
+  VObject object = standin::loadPlugin("scripted", "/plug-ins/scripted.py");
+  VFnPlugin plugin(object);
+  TpythonLock lock;
+  PyObject *globals = PyDict_New();
+  PyDict_SetItemString(globals, "__builtins__", PyEval_GetBuiltins());
+  Py_XDECREF(PyRun_String(kScriptPlugin, Py_file_input, globals, globals));
+  CHECK(!PyErr_Occurred());
+  auto global = [globals](const char *name) { return PyDict_GetItemString(globals, name); };
+  auto handOver = [&](VPxNode *node) {
+    PyObject *address = PyLong_FromVoidPtr(node);
+    PyDict_SetItemString(globals, "address", address);
+    Py_DECREF(address);
+  };
+  PyObject *creator = global("creator"), *initializer = global("initializer");
+  const Py_ssize_t creatorRefs = Py_REFCNT(creator), initializerRefs = Py_REFCNT(initializer);
+
+  standin::resetAnnouncements();
+  VCreatorFunction create = announced<VCreatorFunction>(creator);
+  VInitializeFunction init = announced<VInitializeFunction>(initializer);
+  CHECK(plugin.registerNode("scriptNode", VTypeId(0x500), create, init));
+  CHECK(standin::announcements() == 2 && !VFnPlugin::registeringCallableScript());
+  // The registry keeps the references it was handed.
+  CHECK(Py_REFCNT(creator) == creatorRefs + 1 && Py_REFCNT(initializer) == initializerRefs + 1);
+  auto all = standin::registrations();
+  CHECK(all.size() == 1 && all[0].scriptCallables() == 2 && all[0].callbacks[0].object == creator &&
+        all[0].callbacks[1].role == "initializer" && all[0].callbacks[1].object == initializer);
+
+  // A refused registration lets go of what it was handed.
+  CHECK(plugin.registerNode("scriptNode", VTypeId(0x501), announced<VCreatorFunction>(creator),
+                            announced<VInitializeFunction>(initializer)) == VStatus::kFailure);
+  CHECK(Py_REFCNT(creator) == creatorRefs + 1 && Py_REFCNT(initializer) == initializerRefs + 1);
+
+  standin::resetCounts();
+  auto *cxxNode = new CountingNode;
+  handOver(cxxNode);
+  VPxNode *node = standin::createNode("scriptNode");
+  CHECK(node == cxxNode && PyList_Size(global("disowned")) == 1);
+  CHECK(node && node->typeName() == "scriptNode" && node->typeId() == VTypeId(0x500));
+  CHECK(standin::initializeNode("scriptNode") && PyList_Size(global("initialized")) == 1);
+
+  // A caller's pending error is not the creator's: it survives the call.
+  auto *second = new CountingNode;
+  handOver(second);
+  PyErr_SetString(PyExc_KeyError, "the caller's");
+  CHECK(standin::createNode("scriptNode") == second && PyErr_ExceptionMatches(PyExc_KeyError));
+  PyErr_Clear();
+  standin::deleteNode(second);
+  standin::deleteNode(node);
+  CHECK(standin::aliveCount("VPxNode") == 0);
+
+  // A failing script is reported to the log and makes nothing.
+  CHECK(plugin.registerCommand("brokenCmd", announced<VCreatorFunction>(global("broken"))));
+  CHECK(plugin.registerData("nothingData", VTypeId(0x502),
+                            announced<VCreatorFunction>(global("nothing"))));
+  CHECK(plugin.registerNode("brokenNode", VTypeId(0x503), announced<VCreatorFunction>(creator),
+                            announced<VInitializeFunction>(global("broken"))));
+  Tlog::clear();
+  CHECK(!standin::createCommand("brokenCmd") && !standin::createData(VTypeId(0x502)));
+  CHECK(standin::initializeNode("brokenNode") == VStatus::kFailure && !PyErr_Occurred());
+  auto log = Tlog::entries();
+  CHECK(log.size() == 3 && contains(log[0], "\nValueError: no node today") &&
+        contains(log[1],
+                 "TypeError: a creator must return an instance of a plug-in class, not "
+                 "'NoneType'") &&
+        contains(log[2], "in broken\n"));
+  CHECK(standin::aliveCount("VPxCommand") == 0 && standin::aliveCount("VPxData") == 0);
+
+  // Deregistering and unloading release the references.
+  PyObject *broken = global("broken");
+  const Py_ssize_t brokenRefs = Py_REFCNT(broken);
+  CHECK(plugin.deregisterNode(VTypeId(0x500)));
+  CHECK(Py_REFCNT(creator) == creatorRefs + 1 && Py_REFCNT(initializer) == initializerRefs);
+  standin::unloadPlugin(object);
+  CHECK(Py_REFCNT(creator) == creatorRefs && Py_REFCNT(broken) == brokenRefs - 2);
+  Py_DECREF(globals);
+  standin::resetAnnouncements();
+}
+
 void testFileTranslators() {
   VPxFileTranslator plain;
   VFileObject file;
@@ -1162,6 +1432,7 @@ int main() {
   testMatricesAndPoints();
   testTimesAndEvaluation();
   testNodeOverrides();
+  testRegistry();
   testGeometryValues();
   testDeviceValues();
   testTransform();
@@ -1174,6 +1445,7 @@ int main() {
   testLock();
   testObjectWithLock();
   testExceptionReport();
+  testScriptCallables();
   PyEval_RestoreThread(mainThread);
   Py_FinalizeEx();
 

@@ -5,6 +5,8 @@
 #include <openvorla/VFnBase.h>
 #include <openvorla/VObject.h>
 #include <openvorla/VPluginCallableInfo.h>
+#include <openvorla/VPxData.h>
+#include <openvorla/VPxNode.h>
 #include <openvorla/VStatus.h>
 #include <openvorla/VString.h>
 #include <openvorla/VStringArray.h>
@@ -79,6 +81,111 @@ public:
                      PyObject *creationBatchProc = NULL, PyObject *deletionBatchProc = NULL);
   VStatus registerDisplayFilter(const VString &name, const VString &label,
                                 const VString &classification);
+  VStatus deregisterDisplayFilter(const VString &name);
+
+  // Registration of what the plug-in provides. Each callback is a C++ function
+  // or, announced by setRegisteringCallableScript() just before, a script
+  // object in its place. A name or type id in use is refused with kFailure, a
+  // missing name, type id or required callback with kInvalidParameter. Only
+  // the plug-in that registered something can deregister it; unloading a
+  // plug-in deregisters all it registered.
+
+  // Commands share one namespace, whatever their kind.
+  VStatus registerCommand(const VString &commandName, VCreatorFunction creatorFunction,
+                          VCreateSyntaxFunction createSyntaxFunction = NULL);
+  VStatus deregisterCommand(const VString &commandName);
+  VStatus registerControlCommand(const VString &commandName, VCreatorFunction creatorFunction);
+  VStatus deregisterControlCommand(const VString &commandName);
+  VStatus registerModelEditorCommand(const VString &commandName, VCreatorFunction creatorFunction,
+                                     VCreatorFunction paneCreatorFunction);
+  VStatus deregisterModelEditorCommand(const VString &commandName);
+  VStatus registerConstraintCommand(const VString &commandName, VCreatorFunction creatorFunction);
+  VStatus deregisterConstraintCommand(const VString &commandName);
+  VStatus registerContextCommand(const VString &contextCmdName, VCreatorFunction creatorFunction);
+  // With the tool command that the context runs, registered under its own name.
+  VStatus registerContextCommand(const VString &contextCmdName, VCreatorFunction creatorFunction,
+                                 const VString &toolCmdName, VCreatorFunction toolCmdCreator,
+                                 VCreateSyntaxFunction toolCmdSyntax);
+  // Removes the context command with its tool command; a tool command name
+  // given must be the one registered with it.
+  VStatus deregisterContextCommand(const VString &contextCmdName);
+  VStatus deregisterContextCommand(const VString &contextCmdName, const VString &toolCmdName);
+
+  // Node and data types share one namespace of names and one of type ids.
+  VStatus registerNode(const VString &typeName, const VTypeId &typeId,
+                       VCreatorFunction creatorFunction, VInitializeFunction initFunction,
+                       VPxNode::Type type = VPxNode::kDependNode,
+                       const VString *classification = NULL);
+  VStatus registerShape(const VString &typeName, const VTypeId &typeId,
+                        VCreatorFunction creatorFunction, VInitializeFunction initFunction,
+                        VCreatorFunction uiCreatorFunction, const VString *classification = NULL);
+  VStatus registerShape(const VString &typeName, const VTypeId &typeId,
+                        VCreatorFunction creatorFunction, VInitializeFunction initFunction,
+                        const VString *classification = NULL);
+  VStatus registerTransform(const VString &typeName, const VTypeId &typeId,
+                            VCreatorFunction creatorFunction, VInitializeFunction initFunction,
+                            VCreateXformMatrixFunction xformCreatorFunction, const VTypeId &xformId,
+                            const VString *classification = NULL);
+  // Removes a node, shape or transform type.
+  VStatus deregisterNode(const VTypeId &typeId);
+  VStatus registerData(const VString &typeName, const VTypeId &typeId,
+                       VCreatorFunction creatorFunction, VPxData::Type type = VPxData::kData);
+  VStatus deregisterData(const VTypeId &typeId);
+
+  VStatus registerDevice(const VString &deviceName, VCreatorFunction creatorFunction);
+  VStatus deregisterDevice(const VString &deviceName);
+  VStatus registerIkSolver(const VString &ikSolverName, VCreatorFunction creatorFunction);
+  VStatus deregisterIkSolver(const VString &ikSolverName);
+  VStatus registerCacheFormat(const VString &cacheFormatName, VCreatorFunction creatorFunction);
+  VStatus deregisterCacheFormat(const VString &cacheFormatName);
+  VStatus registerDragAndDropBehavior(const VString &behaviorName,
+                                      VCreatorFunction creatorFunction);
+  VStatus deregisterDragAndDropBehavior(const VString &behaviorName);
+  VStatus registerAttributePatternFactory(const VString &factoryName,
+                                          VCreatorFunction factoryCreator);
+  VStatus deregisterAttributePatternFactory(const VString &factoryName);
+  VStatus registerRenderer(const VString &rendererName, VCreatorFunction creatorFunction);
+  VStatus deregisterRenderer(const VString &rendererName);
+  VStatus registerMaterialInfo(const VString &materialType,
+                               VCreateMaterialInfoFunction creatorFunction);
+  VStatus deregisterMaterialInfo(const VString &materialType);
+  VStatus registerBakeEngine(const VString &typeName, VCreateBakeEngineFunction creatorFunction);
+  VStatus deregisterBakeEngine(const VString &typeName);
+  // Evaluators are known by name and by an id unique among evaluators.
+  VStatus registerEvaluator(const VString &evaluatorName, unsigned int uniqueId,
+                            VCustomEvaluatorCreatorFunction creatorFunction);
+  VStatus unregisterEvaluator(const VString &evaluatorName);
+  VStatus registerTopologyEvaluator(const VString &evaluatorName, unsigned int uniqueId,
+                                    VTopologyEvaluatorCreatorFunction creatorFunction);
+  VStatus unregisterTopologyEvaluator(const VString &evaluatorName);
+
+  // pixmapName, optionsScriptName and defaultOptionsString may be NULL.
+  VStatus registerFileTranslator(const VString &translatorName, const char *pixmapName,
+                                 VCreatorFunction creatorFunction,
+                                 const char *optionsScriptName = NULL,
+                                 const char *defaultOptionsString = NULL,
+                                 bool requiresFullScript = false,
+                                 const VString &dataStorageLocation = kDefaultDataLocation);
+  VStatus deregisterFileTranslator(const VString &translatorName);
+  VStatus registerURIFileResolver(const VString &fileResolverName, const VString &uriScheme,
+                                  VCreatorFunction creatorFunction);
+  VStatus deregisterURIFileResolver(const VString &fileResolverName);
+  // The plug-in's string resources, registered by the function given, and the
+  // script procedure that localizes them; once per plug-in.
+  VStatus registerUIStrings(VInitializeFunction registerStringResources,
+                            const VString &pluginStringsProcName);
+  VStatus registerImageFile(const VString &imageFormatName, VCreatorFunction creatorFunction,
+                            const VStringArray &imageFileExtensions,
+                            ImageFilePriority priority = kImageFilePriorityDefault);
+  VStatus deregisterImageFile(const VString &imageFormatName);
+  // With overrideExisting, replaces a pass implementation of the same id.
+  VStatus registerRenderPassImpl(const VString &passImplId, VRenderPassDef *passDef,
+                                 VCreatorFunction creatorFunction, bool overrideExisting = false);
+  VStatus deregisterRenderPassImpl(const VString &passImplId);
+  // Interpolators are known by name and by a type id unique among them.
+  VStatus registerAnimCurveInterpolator(const VString &typeName, int typeId,
+                                        VCreatorFunction creatorFunction, int flags = 0);
+  VStatus deregisterAnimCurveInterpolator(const VString &typeName);
 
   // Announces that the next callable given to a registration function is a
   // script object, not a function. registeringCallableScript() tells whether

@@ -1,0 +1,27 @@
+// Stand-in only: how the plug-in registry runs the script objects that a
+// plug-in registered in place of C++ callbacks. The registry lives in the
+// interface library, which knows nothing of Python; the scripting engine
+// installs these when it is loaded.
+#pragma once
+
+#include <openvorla/VApiVersion.h>
+#include <openvorla/VTypes.h>
+
+namespace standin {
+
+struct ScriptCallableHooks {
+  // Calls the object with no arguments and takes over the instance it
+  // returns; its C++ address, or null with the failure reported.
+  void *(*create)(PyObject *creator);
+  // Calls the object with no arguments; false, the failure reported, if it
+  // raised.
+  bool (*run)(PyObject *callable);
+  // Drops the reference the registry holds.
+  void (*release)(PyObject *object);
+};
+
+// hooks must outlive their use; null uninstalls them. Without hooks, script
+// callables are recorded but never called, nor released.
+OPENVORLA_EXPORT void setScriptCallableHooks(const ScriptCallableHooks *hooks);
+
+}  // namespace standin

@@ -1,0 +1,97 @@
+// The scripting engine's side of plug-in callbacks: calling the script
+// objects that a Python plug-in registered, and letting go of them.
+#define PY_SSIZE_T_CLEAN
+#include <Python.h>
+
+#include <scriptrunner/TpythonInterpreter.h>
+#include <scriptrunner/TpythonLock.h>
+
+#include <standin/ScriptCallables.h>
+
+namespace {
+
+// The host may call in while its caller has a Python error pending (a binding
+// going on after a failed string conversion); that error is not the
+// callback's, so it is set aside for the call and put back afterwards.
+class PendingError {
+ public:
+  PendingError() { PyErr_Fetch(&fType, &fValue, &fTraceback); }
+  ~PendingError() { PyErr_Restore(fType, fValue, fTraceback); }
+  PendingError(const PendingError &) = delete;
+  PendingError &operator=(const PendingError &) = delete;
+
+ private:
+  PyObject *fType, *fValue, *fTraceback;
+};
+
+// The C++ address of a proxy instance: its "this" converts to the address.
+void *addressOf(PyObject *instance) {
+  PyObject *self = PyObject_GetAttrString(instance, "this");
+  if (!self) {
+    if (PyErr_ExceptionMatches(PyExc_AttributeError)) {
+      PyErr_Clear();
+      PyErr_Format(PyExc_TypeError,
+                   "a creator must return an instance of a plug-in class, not '%.200s'",
+                   Py_TYPE(instance)->tp_name);
+    }
+    return nullptr;
+  }
+  PyObject *number = PyNumber_Long(self);
+  Py_DECREF(self);
+  if (!number) return nullptr;
+  void *address = PyLong_AsVoidPtr(number);
+  Py_DECREF(number);
+  if (!address && !PyErr_Occurred())
+    PyErr_SetString(PyExc_ValueError, "a creator returned an instance without a C++ object");
+  return address;
+}
+
+void *create(PyObject *creator) {
+  TpythonLock lock;
+  PendingError pending;
+  void *address = nullptr;
+  if (PyObject *instance = PyObject_CallNoArgs(creator)) {
+    // The address is read before ownership moves, so that a failure leaves
+    // the instance to Python, which frees it, rather than to nobody.
+    address = addressOf(instance);
+    if (address) {
+      // Hands the C++ object to the host; the instance lives on as long as it.
+      PyObject *disowned = PyObject_CallMethod(instance, "__disown__", nullptr);
+      if (disowned)
+        Py_DECREF(disowned);
+      else
+        address = nullptr;
+    }
+    Py_DECREF(instance);
+  }
+  if (!address) TpythonInterpreter::interpreter().catchAndReportException();
+  return address;
+}
+
+bool run(PyObject *callable) {
+  TpythonLock lock;
+  PendingError pending;
+  PyObject *result = PyObject_CallNoArgs(callable);
+  if (!result) {
+    TpythonInterpreter::interpreter().catchAndReportException();
+    return false;
+  }
+  Py_DECREF(result);
+  return true;
+}
+
+void release(PyObject *object) {
+  if (!Py_IsInitialized()) return;  // gone with the interpreter
+  TpythonLock lock;
+  Py_DECREF(object);
+}
+
+const standin::ScriptCallableHooks kHooks{&create, &run, &release};
+
+// Installed while the engine is loaded.
+struct Installation {
+  Installation() { standin::setScriptCallableHooks(&kHooks); }
+  ~Installation() { standin::setScriptCallableHooks(nullptr); }
+} gInstallation;
+
+}  // namespace
