@@ -174,3 +174,12 @@ def test_a_plugin_from_registration_to_unloading(tmp_path):
     assert not [r for r in host.registrations() if r['plugin'] == 'sine']
     assert [sys.getrefcount(c) for c in creators] == refs
     host.unload_all_plugins()
+
+
+def test_lookups_answer_from_the_registry(plugin):
+    assert not vpx.VFnPlugin.isNodeRegistered('lookedUp')
+    plugin.registerNode('lookedUp', ov.VTypeId(0x92), creator, creator)
+    assert vpx.VFnPlugin.isNodeRegistered('lookedUp')
+    assert vpx.VFnPlugin(vpx.VFnPlugin.findPlugin('registering')).name() == 'registering'
+    plugin.deregisterNode(ov.VTypeId(0x92))
+    assert not vpx.VFnPlugin.isNodeRegistered('lookedUp')
