@@ -1,0 +1,110 @@
+// Stand-in only: the application's dependency graph and command engine, as
+// the application and its host scripting module drive them. Plug-ins never
+// see this: they reach the graph through the SDK (VPxNode::addAttribute,
+// attributeAffects, compute with VPlug and VDataBlock, VFnNumericAttribute).
+#pragma once
+
+#include <openvorla/VApiVersion.h>
+#include <openvorla/VStatus.h>
+
+#include <string>
+#include <vector>
+
+namespace standin {
+
+// One value of an attribute: numeric attributes hold a double (booleans and
+// integers as doubles too), string attributes a string.
+struct Value {
+  bool isString = false;
+  double number = 0.0;
+  std::string text;
+};
+
+// A node as the application lists it.
+struct NodeInfo {
+  std::string name;
+  std::string type;
+  std::vector<std::string> attributes;  // long names, in declaration order
+  long computeCount = 0;                // compute calls made on the node so far
+};
+
+class OPENVORLA_EXPORT Graph {
+ public:
+  static Graph &instance();
+
+  // A node of a registered type, made through the type's creator (the type's
+  // initializer runs once, before its first node). `name` empty: "<type>1",
+  // "<type>2", ... The graph owns the node.
+  OPENVORLA_NAMESPACE::VStatus createNode(const std::string &type, const std::string &name,
+                                          std::string *made);
+  OPENVORLA_NAMESPACE::VStatus deleteNode(const std::string &name);
+  // Deletes every node whose type a plug-in registered (before it unloads).
+  void deleteNodesOfPlugin(const std::string &plugin);
+  std::vector<NodeInfo> nodes() const;
+
+  // "node.attribute" plugs. Setting an input marks what it affects dirty,
+  // downstream through connections too. Getting an output computes it when
+  // dirty (the node's compute, through the director for a Python node).
+  OPENVORLA_NAMESPACE::VStatus setAttr(const std::string &plug, const Value &value);
+  OPENVORLA_NAMESPACE::VStatus getAttr(const std::string &plug, Value *value);
+  OPENVORLA_NAMESPACE::VStatus connect(const std::string &source, const std::string &destination);
+  OPENVORLA_NAMESPACE::VStatus disconnect(const std::string &source,
+                                          const std::string &destination);
+
+  // Computes every dirty output of the graph. Nodes whose inputs are clean
+  // are computed together on a pool of `threads` host threads (1: all on the
+  // calling thread); each call into Python takes the interpreter lock itself.
+  // The caller must not hold the interpreter lock when threads > 1.
+  OPENVORLA_NAMESPACE::VStatus evaluate(int threads);
+  // The host threads that ran compute during the last evaluate(), as small
+  // numbers 0..n-1 in the order they first computed.
+  std::vector<int> lastEvaluationThreads() const;
+
+  void clear();  // deletes every node
+
+ private:
+  Graph();
+  struct Impl;
+  Impl *impl_;
+};
+
+// Commands: made through the registry, run, and kept for undo and redo when
+// they are undoable.
+class OPENVORLA_EXPORT Commands {
+ public:
+  static Commands &instance();
+  // Runs the command with its arguments (each a string, integer, double or
+  // bool, passed in a VArgList). The command's result comes back as text.
+  OPENVORLA_NAMESPACE::VStatus run(const std::string &name, const std::vector<Value> &args,
+                                   std::string *result);
+  OPENVORLA_NAMESPACE::VStatus undo();
+  OPENVORLA_NAMESPACE::VStatus redo();
+  // Deletes the commands kept for undo and redo.
+  void flush();
+
+ private:
+  Commands();
+  struct Impl;
+  Impl *impl_;
+};
+
+// Scene files through registered file translators: the translator's writer
+// and reader run with the file named by `path`.
+class OPENVORLA_EXPORT Files {
+ public:
+  static OPENVORLA_NAMESPACE::VStatus exportScene(const std::string &path,
+                                                  const std::string &translator);
+  static OPENVORLA_NAMESPACE::VStatus importScene(const std::string &path,
+                                                  const std::string &translator);
+};
+
+// A registered data type exercised as the application does: made through its
+// creator, read from ASCII text (readASCII with the text's words as its
+// argument list), copied into a second instance (copy), and both written
+// back as ASCII (writeASCII). Both instances are deleted afterwards.
+OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VStatus roundTripData(const std::string &dataType,
+                                                           const std::string &text,
+                                                           std::string *written,
+                                                           std::string *copied);
+
+}  // namespace standin
