@@ -1,11 +1,18 @@
 // bench_pybind: the benchmark's host calls bound with pybind11, the way a
 // plug-in author would bind them: classes with py::class_, host strings
-// through type casters, a failed status raised as an exception.
+// through type casters, a failed status raised as an exception. VPxNode and
+// VPxData have trampolines, so that Python subclasses override their
+// virtuals for the host, and the host's side of those calls is timed here
+// with the loops of host_loops.h.
 #include <pybind11/pybind11.h>
 
 #include <openvorla/VFnPlugin.h>
 #include <openvorla/VPxCommand.h>
+#include <openvorla/VPxData.h>
 #include <openvorla/VPxNode.h>
+#include <scriptrunner/TpythonInterpreter.h>
+
+#include "host_loops.h"
 
 namespace py = pybind11;
 using namespace OPENVORLA_NAMESPACE;
@@ -54,10 +61,102 @@ struct type_caster<VStringArray> {
 
 }  // namespace pybind11::detail
 
+namespace {
+
+// A Python exception out of an override is reported through the host's
+// engine and the host gets the default, as the forwarding overrides do.
+void Report(py::error_already_set &error) {
+  error.restore();
+  TpythonInterpreter::interpreter().catchAndReportException();
+}
+
+// The trampolines: each override is what PYBIND11_OVERRIDE expands to (the
+// lock, get_override, the call) with the forwarding overrides' result rules
+// and failure handling. The host objects go in as pointers, which pybind11
+// wraps by reference; a reference argument would be copied.
+class PyNode : public VPxNode {
+ public:
+  VStatus compute(const VPlug &plug, VDataBlock &block) override {
+    py::gil_scoped_acquire gil;
+    try {
+      py::function override = py::get_override(static_cast<const VPxNode *>(this), "compute");
+      if (!override) return VPxNode::compute(plug, block);
+      py::object result = override(&plug, &block);
+      static PyObject *unknown = PyUnicode_InternFromString("unknown");
+      PyObject *r = result.ptr();
+      if ((PyUnicode_Check(r) || PyBytes_Check(r)) && r == unknown) return VStatus::kUnknownParameter;
+      return VStatus::kSuccess;
+    } catch (py::error_already_set &error) {
+      Report(error);
+      return VStatus::kFailure;
+    }
+  }
+
+  bool isAbstractClass() const override {
+    py::gil_scoped_acquire gil;
+    try {
+      py::function override = py::get_override(static_cast<const VPxNode *>(this), "isAbstractClass");
+      if (!override) return VPxNode::isAbstractClass();
+      return override().ptr() == Py_True;
+    } catch (py::error_already_set &error) {
+      Report(error);
+      return false;
+    }
+  }
+};
+
+class PyData : public VPxData {
+ public:
+  VString name() const override {
+    py::gil_scoped_acquire gil;
+    try {
+      py::function override = py::get_override(static_cast<const VPxData *>(this), "name");
+      if (!override) py::pybind11_fail("pure virtual VPxData::name called");
+      py::object result = override();
+      py::detail::make_caster<VString> text;
+      if (!text.load(result, false))
+        PyErr_SetString(PyExc_TypeError, "Invalid Python object, expected a String or Unicode object");
+      return py::detail::cast_op<VString &&>(std::move(text));
+    } catch (py::error_already_set &error) {
+      Report(error);
+      return VString();
+    }
+  }
+
+  void copy(const VPxData &source) override { PYBIND11_OVERRIDE_PURE(void, VPxData, copy, &source); }
+  VTypeId typeId() const override { PYBIND11_OVERRIDE_PURE(VTypeId, VPxData, typeId, ); }
+};
+
+// The timing functions of bench_overrides, on pybind11's objects.
+py::object Checked(PyObject *result) {
+  if (!result) throw py::error_already_set();
+  return py::reinterpret_steal<py::object>(result);
+}
+
+template <class T>
+void Timed(py::module_ &m, const char *name, bench::Timing (*loop)(T *, long)) {
+  m.def(name, [loop](T *object, long n) {
+    if (n < 1) throw py::value_error("at least one call");
+    return Checked(bench::Report(loop(object, n)));
+  });
+}
+
+template <class T>
+void Single(py::module_ &m, const char *name, PyObject *(*once)(T *)) {
+  m.def(name, [once](T *object) { return Checked(once(object)); });
+}
+
+}  // namespace
+
 PYBIND11_MODULE(bench_pybind, m) {
   m.def("registeringCallableScript", &VFnPlugin::registeringCallableScript);
 
-  py::class_<VPxNode>(m, "VPxNode")
+  // Only passed to overrides.
+  py::class_<VPlug>(m, "VPlug");
+  py::class_<VDataBlock>(m, "VDataBlock");
+  py::class_<VTypeId>(m, "VTypeId");
+
+  py::class_<VPxNode, PyNode>(m, "VPxNode")
       .def(py::init<>())
       .def("isAbstractClass", &VPxNode::isAbstractClass)
       .def("getFilesToArchive", &VPxNode::getFilesToArchive, py::arg("shortName") = false,
@@ -80,4 +179,14 @@ PYBIND11_MODULE(bench_pybind, m) {
         if (status.statusCode() == VStatus::kUnknownParameter) return py::str("unknown");
         throw std::runtime_error(status.errorString().asUTF8());
       });
+
+  py::class_<VPxData, PyData>(m, "VPxData").def(py::init<>());
+
+  Timed<VPxNode>(m, "compute", bench::Compute);
+  Timed<VPxNode>(m, "compute_in_thread", bench::ComputeInThread);
+  Timed<VPxNode>(m, "isAbstractClass", bench::IsAbstractClass);
+  Timed<VPxData>(m, "name", bench::Name);
+  Single<VPxNode>(m, "compute_once", bench::ComputeOnce);
+  Single<VPxNode>(m, "isAbstractClass_once", bench::IsAbstractClassOnce);
+  Single<VPxData>(m, "name_once", bench::NameOnce);
 }
