@@ -33,6 +33,10 @@ class Manifest:
     # expects a function pointer; called once per callable passed.
     callable_announcement: str = ''
     skip: list[str] = field(default_factory=list)        # "Class::member" not wrapped
+    # String resources of the scripting engine the module declares: table, keys
+    # in order of construction.
+    resource_table: str = ''
+    resources: list[str] = field(default_factory=list)
     handwritten: dict[str, list[str]] = field(default_factory=dict)  # class -> members in wrap/
     source: str = ''               # manifest path as given, for banners
 
@@ -65,6 +69,8 @@ def load(path: str, display_name: str | None = None) -> Manifest:
             functions=list(mod.get('functions', [])),
             callable_announcement=mod.get('callable_announcement', ''),
             skip=list(mod.get('skip', [])),
+            resource_table=mod.get('resource_table', ''),
+            resources=list(mod.get('resources', [])),
             handwritten={k: list(v) for k, v in data.get('handwritten', {}).items()},
             source=display_name or path)
     except KeyError as e:

@@ -11,6 +11,7 @@ def emit(module: Module) -> str:
            '#include <map>\n#include <string>\n\n'
            '#include "swigrt.h"\n#include "errors.h"\n#include "args.h"\n#include "dispatch.h"\n'
            '#include "scalars.h"\n#include "text.h"\n'
+           + ('#include <scriptrunner/TstringId.h>\n' if module.resources else '')
            + ('#include "director.h"\n#include "forward.h"\n' if module.directors else '') + '\n']
     out += [f'#include <{h}>\n' for h in module.headers]
     if module.namespace:

@@ -53,6 +53,11 @@ def emit(module: Module) -> str:
     if module.api_version:
         out.append(_exports(module))
     out.append(namespace_open(module))
+    if module.resources:
+        out.append('\n// Message resources of the scripting engine, made in this order when the\n'
+                   '// library loads and destroyed in reverse when it unloads.\n')
+        out += [f'TstringId {key}({c_string(table)}, {c_string(key)});\n'
+                for table, key in module.resources]
     out.append('\nnamespace {\n\n'
                'swig_const_info constant_table[] = {{0, nullptr, 0, 0, nullptr, nullptr}};\n\n'
                'PyModuleDef module_def = {\n'

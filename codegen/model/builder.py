@@ -327,7 +327,8 @@ class Builder:
         api = self.h.macros.get(self.m.api_version_macro, '') if self.m.api_version_macro else ''
         return Module(self.m.name, self.m.proxy, self.m.source, self.m.namespace,
                       [c.header for c in self.m.classes], self.m.imports, pointer_classes, classes,
-                      descriptors, entries, start, installs, api, functions)
+                      descriptors, entries, start, installs, api, functions,
+                      [(self.m.resource_table, key) for key in self.m.resources])
 
     def string_macro(self, name: str) -> str:
         text = self.h.macros.get(name)

@@ -201,6 +201,7 @@ class Module:
     installs: list[Constant | GlobalVariable]
     api_version: str
     functions: list[MethodEntry] = field(default_factory=list)   # hand-written free functions
+    resources: list[tuple[str, str]] = field(default_factory=list)  # (table, key), in order
 
     @property
     def directors(self) -> list['DirectorClass']:

@@ -40,3 +40,4 @@ def test_eight_host_threads_ten_thousand_calls_each():
     done = subprocess.run([sys.executable, '-c', CHILD], env=env, capture_output=True, text=True,
                           timeout=300)
     assert done.returncode == 0 and done.stdout.strip() == 'ok', done.stderr
+

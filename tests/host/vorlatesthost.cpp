@@ -2,6 +2,7 @@
 // the sibling modules see it.
 #include <standin/Lifetime.h>
 #include <standin/Plugins.h>
+#include <scriptrunner/TstringId.h>
 
 #include <cstdint>
 #include <map>
@@ -398,6 +399,11 @@ PyObject *director_exception(PyObject *, PyObject *args) {
   return result;
 }
 
+// string_ids() -> (constructed, destroyed) of the engine's resource identifiers
+PyObject *string_ids(PyObject *, PyObject *) {
+  return Py_BuildValue("(ii)", TstringId::constructedCount(), TstringId::destroyedCount());
+}
+
 template <long (*Count)(const char *)>
 PyObject *counter(PyObject *, PyObject *arg) {
   const char *cls = PyUnicode_AsUTF8(arg);
@@ -429,6 +435,7 @@ PyMethodDef methods[] = {
     {"create_command", create_command, METH_O, "A command made through its creator."},
     {"delete_node", delete_node, METH_O, "The host deletes a node it made."},
     {"delete_command", delete_command, METH_O, "The host deletes a command it made."},
+    {"string_ids", string_ids, METH_NOARGS, "Resource identifiers made and destroyed."},
     {"alive", counter<standin::aliveCount>, METH_O, "Host objects of a class alive now."},
     {"constructed", counter<standin::constructedCount>, METH_O, "Host objects constructed."},
     {"destroyed", counter<standin::destroyedCount>, METH_O, "Host objects destroyed."},
