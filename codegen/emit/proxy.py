@@ -32,6 +32,22 @@ def _proxy_repr(self):
     return f'<{{type(self).__module__}}.{{type(self).__qualname__}}; proxy of {{this}} >'
 
 
+class _static_variable:
+    """A static variable of the host class, read through the class or an
+    instance and written through an instance."""
+
+    def __init__(self, name, get, set=None):
+        self._name, self._get, self._set = name, get, set
+
+    def __get__(self, obj, cls=None):
+        return self._get()
+
+    def __set__(self, obj, value):
+        if self._set is None:
+            raise AttributeError(f'Variable {{self._name}} is read-only.')
+        self._set(value)
+
+
 cvar = _ext.cvar
 '''
 
@@ -68,6 +84,12 @@ def _class(cls: WrappedClass) -> str:
     if cls.constants:
         out.append('\n')
         out += [f'    {c.name[len(n) + 1:]} = _ext.{c.name}\n' for c in cls.constants]
+    if cls.variables:
+        out.append('\n')
+    for v in cls.variables:
+        setter = 'None' if v.readonly else f'_ext.{v.name}_set'
+        out.append(f'    {v.name[len(n) + 1:]} = _static_variable({v.name!r}, _ext.{v.name}_get, '
+                   f'{setter})\n')
     out.append(f'\n\n_ext.{n}_swigregister({n})\n')
     return ''.join(out)
 

@@ -13,6 +13,18 @@ def setter(v: GlobalVariable) -> str:
     return f'set_{v.name}'
 
 
+def _entry_points(v: GlobalVariable) -> str:
+    out = (f'PyObject *wrap_{v.name}_get(PyObject *, PyObject *args) {{\n'
+           '  PyObject *argv[1];\n'
+           f'  if (!swigrt::UnpackTuple(args, {c_string(v.name + "_get")}, 0, 0, argv)) return nullptr;\n'
+           f'  return {getter(v)}();\n}}\n')
+    if not v.readonly:
+        out += (f'PyObject *wrap_{v.name}_set(PyObject *, PyObject *arg) {{\n'
+                f'  if (!arg || {setter(v)}(arg)) return nullptr;\n'
+                '  Py_RETURN_NONE;\n}\n')
+    return out + '\n'
+
+
 def _pair(v: GlobalVariable) -> str:
     # The wrapper points at the host's static itself and never owns it.
     address = f'const_cast<{v.spelling} *>(&{v.cpp})' if v.readonly else f'&{v.cpp}'
@@ -32,6 +44,6 @@ def _pair(v: GlobalVariable) -> str:
 def emit(module: Module) -> str:
     out = [banner(module, f'the {len(module.variables)} static variables of cvar'),
            f'#include "{module.ident}_wrap.h"\n\n', namespace_open(module), '\n']
-    out += [_pair(v) for v in module.variables]
+    out += [_pair(v) + _entry_points(v) for v in module.variables]
     out.append(namespace_close(module))
     return ''.join(out)

@@ -309,6 +309,11 @@ class Builder:
                                            c.constructor.flags))
             entries.append(MethodEntry(c.delete_entry, f'wrap_{c.delete_entry}', METH_O))
             entries += [MethodEntry(m.entry, m.function, m.flags) for m in c.members]
+            # Each static variable is also reached through its own functions.
+            for v in c.variables:
+                entries.append(MethodEntry(f'{v.name}_get', f'wrap_{v.name}_get', METH_VARARGS))
+                if not v.readonly:
+                    entries.append(MethodEntry(f'{v.name}_set', f'wrap_{v.name}_set', METH_O))
             if c.director:
                 entries.append(MethodEntry(f'disown_{c.name}', f'wrap_disown_{c.name}', METH_O))
             entries.append(MethodEntry(f'{c.name}_swigregister', f'wrap_{c.name}_swigregister',

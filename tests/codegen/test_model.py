@@ -131,14 +131,19 @@ def test_method_table_order_and_flags(fixture):
     rows = [(e.name, e.flags) for e in fixture.entries]
     assert rows[:2] == [('SWIG_PyInstanceMethod_New', METH_O), ('SWIG_PyStaticMethod_New', METH_O)]
     # Members sit between destruction and the hand-over to the host.
-    assert rows[2:14] == [('new_Node', METH_O), ('delete_Node', METH_O), ('Node_count', METH_O),
+    assert rows[2:17] == [('new_Node', METH_O), ('delete_Node', METH_O), ('Node_count', METH_O),
                           ('Node_setCount', METH_VARARGS), ('Node_make', METH_VARARGS),
                           ('Node_parent', METH_O), ('Node_value', METH_O),
                           ('Node_rename', METH_VARARGS), ('Node_names', METH_VARARGS),
-                          ('Node_pick', METH_VARARGS), ('disown_Node', METH_O),
+                          ('Node_pick', METH_VARARGS),
+                          # Each static variable has its own getter, and a setter when
+                          # it is writable.
+                          ('Node_caching_get', METH_VARARGS), ('Node_caching_set', METH_O),
+                          ('Node_identity_get', METH_VARARGS), ('disown_Node', METH_O),
                           ('Node_swigregister', METH_O)]
     # No director: no disown entry.
-    assert rows[-4:] == [('new_Value', METH_VARARGS), ('delete_Value', METH_O),
+    assert rows[-5:] == [('new_Value', METH_VARARGS), ('delete_Value', METH_O),
+                         ('Value_kEmpty_get', METH_VARARGS),
                          ('Value_swigregister', METH_O), ('Value_swiginit', METH_VARARGS)]
 
 

@@ -29,6 +29,22 @@ def _proxy_repr(self):
     return f'<{type(self).__module__}.{type(self).__qualname__}; proxy of {this} >'
 
 
+class _static_variable:
+    """A static variable of the host class, read through the class or an
+    instance and written through an instance."""
+
+    def __init__(self, name, get, set=None):
+        self._name, self._get, self._set = name, get, set
+
+    def __get__(self, obj, cls=None):
+        return self._get()
+
+    def __set__(self, obj, value):
+        if self._set is None:
+            raise AttributeError(f'Variable {self._name} is read-only.')
+        self._set(value)
+
+
 cvar = _ext.cvar
 SDK_MAKER = _ext.SDK_MAKER
 
@@ -60,6 +76,9 @@ class Node(object):
     kGroup = _ext.Node_kGroup
     kDefault = _ext.Node_kDefault
     kNone = _ext.Node_kNone
+
+    caching = _static_variable('Node_caching', _ext.Node_caching_get, _ext.Node_caching_set)
+    identity = _static_variable('Node_identity', _ext.Node_identity_get, None)
 
 
 _ext.Node_swigregister(Node)
@@ -164,6 +183,8 @@ class Value(object):
         _ext.Value_swiginit(self, _ext.new_Value(*args))
 
     __swig_destroy__ = _ext.delete_Value
+
+    kEmpty = _static_variable('Value_kEmpty', _ext.Value_kEmpty_get, None)
 
 
 _ext.Value_swigregister(Value)

@@ -56,6 +56,9 @@ PyObject *wrap_Node_value(PyObject *self, PyObject *args);
 PyObject *wrap_Node_rename(PyObject *self, PyObject *args);
 PyObject *wrap_Node_names(PyObject *self, PyObject *args);
 PyObject *wrap_Node_pick(PyObject *self, PyObject *args);
+PyObject *wrap_Node_caching_get(PyObject *self, PyObject *args);
+PyObject *wrap_Node_caching_set(PyObject *self, PyObject *args);
+PyObject *wrap_Node_identity_get(PyObject *self, PyObject *args);
 PyObject *wrap_disown_Node(PyObject *self, PyObject *args);
 PyObject *wrap_Node_swigregister(PyObject *self, PyObject *args);
 PyObject *wrap_new_Shape(PyObject *self, PyObject *args);
@@ -81,6 +84,7 @@ PyObject *wrap_disown_Pair(PyObject *self, PyObject *args);
 PyObject *wrap_Pair_swigregister(PyObject *self, PyObject *args);
 PyObject *wrap_new_Value(PyObject *self, PyObject *args);
 PyObject *wrap_delete_Value(PyObject *self, PyObject *args);
+PyObject *wrap_Value_kEmpty_get(PyObject *self, PyObject *args);
 PyObject *wrap_Value_swigregister(PyObject *self, PyObject *args);
 
 PyObject *get_Node_caching();
