@@ -21,10 +21,13 @@ build: deps $(BUILD)/build.ninja
 test: build
 	cmake --build $(BUILD) --target test-support
 	$(BUILD)/bin/host_selftest
-	$(PYTHON) -m pytest -q tests
+	OPENVORLA_BUILD=$(BUILD) $(PYTHON) -m pytest -q tests
+
+EXAMPLES := sine_node offset_command vector_data text_translator
 
 demo: build
-	$(PYTHON) examples/module_summary.py
+	$(BUILD)/bin/vorla $(foreach p,$(EXAMPLES),--plugin examples/plugins/$(p).py) \
+	  examples/scenes/demo.py
 
 # Configured again after the install: the bench modules need pybind11 found.
 bench: build

@@ -5,6 +5,7 @@
 #include <openvorla/VFnPlugin.h>
 #include <openvorla/VPxCommand.h>
 #include <openvorla/VPxData.h>
+#include <openvorla/VPxFileTranslator.h>
 #include <openvorla/VPxNode.h>
 #include <openvorla/VTypeId.h>
 
@@ -138,6 +139,7 @@ struct Registry {
   std::mutex mutex;
   std::vector<RegistrationPtr> entries;  // in the order they were made
   unsigned long made = 0;                // instances made, for their names
+  unsigned long added = 0;               // registrations added, for their serial numbers
 
   // The registration that one of the new one's names clashes with, if any,
   // and that name.
@@ -245,6 +247,7 @@ VStatus add(const RegistrationPtr &r, Released &released) {
     released.push_back(std::move(*it));
     entries.erase(it);
   }
+  r->serial = ++registry.added;
   registry.entries.push_back(r);
   return VStatus::kSuccess;
 }
@@ -415,17 +418,37 @@ VPxNode *createNode(const VString &typeName) {
   return node;
 }
 
+unsigned long nodeTypeSerial(const VString &typeName) {
+  RegistrationPtr r = findNamed(typeName, isNodeKind);
+  return r ? r->serial : 0;
+}
+
 VStatus initializeNode(const VString &typeName) {
   RegistrationPtr r = findNamed(typeName, isNodeKind);
   if (!r)
     return VStatus(VStatus::kInvalidParameter,
                    VString("No node type named ") + quoted(typeName) + " is registered");
   const Callback &init = *r->find(CallbackRole::kInitializer);
-  beginNodeType();
-  if (!init.script) return reinterpret_cast<VInitializeFunction>(init.function)();
-  const ScriptCallableHooks *hooks = gHooks.load();
-  if (hooks && hooks->run(init.script)) return VStatus::kSuccess;
-  return VStatus(VStatus::kFailure, VString("The initializer of ") + describe(*r) + " failed");
+  // The declarations end however the initializer does, a C++ exception included.
+  struct Declaring {
+    Declaring() { beginNodeType(); }
+    ~Declaring() { endNodeType(); }
+  };
+  VStatus status = VStatus::kSuccess;
+  {
+    Declaring declaring;
+    if (!init.script) {
+      status = reinterpret_cast<VInitializeFunction>(init.function)();
+    } else {
+      const ScriptCallableHooks *hooks = gHooks.load();
+      if (!hooks || !hooks->run(init.script)) status = VStatus::kFailure;
+    }
+  }
+  if (status) return status;
+  // A script's failure is in the log; its status says no more.
+  VString message = VString("The initializer of ") + describe(*r) + " failed";
+  if (!init.script) message += VString(": ") + status.errorString();
+  return VStatus(status.statusCode(), message);
 }
 
 VPxCommand *createCommand(const VString &commandName) {
@@ -448,8 +471,24 @@ VPxData *createData(const VTypeId &typeId) {
   return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator))) : nullptr;
 }
 
+VPxData *createData(const VString &typeName) {
+  RegistrationPtr r = findNamed(typeName, [](RegistrationKind k) {
+    return k == RegistrationKind::kData;
+  });
+  return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator))) : nullptr;
+}
+
+VPxFileTranslator *createTranslator(const VString &translatorName) {
+  RegistrationPtr r = findNamed(translatorName, [](RegistrationKind k) {
+    return k == RegistrationKind::kFileTranslator;
+  });
+  return r ? static_cast<VPxFileTranslator *>(make(*r, *r->find(CallbackRole::kCreator)))
+           : nullptr;
+}
+
 void deleteNode(VPxNode *node) { delete node; }
 void deleteCommand(VPxCommand *command) { delete command; }
 void deleteData(VPxData *data) { delete data; }
+void deleteTranslator(VPxFileTranslator *translator) { delete translator; }
 
 }  // namespace standin

@@ -96,6 +96,7 @@ class Registration {
   unsigned int secondTypeId = 0;
   int flags = 0;
   bool overrideExisting = false;
+  unsigned long serial = 0;  // set when added: distinct for every registration ever added
   VObject plugin;
   std::vector<Callback> callbacks;
 

@@ -10,6 +10,8 @@
 #include <cstring>
 #include <string>
 
+#include "NumberText.h"
+
 OPENVORLA_NAMESPACE_OPEN
 
 namespace {
@@ -53,14 +55,6 @@ bool parseBool(const char *text, bool &value) {
       return true;
     }
   return false;
-}
-
-// The shortest of the usual precisions that reads back as the same double.
-std::string formatDouble(double value) {
-  char text[32];
-  std::snprintf(text, sizeof text, "%.15g", value);
-  if (std::strtod(text, nullptr) != value) std::snprintf(text, sizeof text, "%.17g", value);
-  return text;
 }
 
 }  // namespace

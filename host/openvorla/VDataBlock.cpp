@@ -2,19 +2,11 @@
 #include <openvorla/VDataBlock.h>
 #include <openvorla/VDataHandle.h>
 
-#include <mutex>
 #include <utility>
-#include <vector>
+
+#include "DataBlockState.h"
 
 OPENVORLA_NAMESPACE_OPEN
-
-struct VDataSlot {
-  std::mutex mutex;
-  double number = 0.0;
-  VString text;
-  bool isText = false;
-  bool clean = false;
-};
 
 VDataHandle::VDataHandle() = default;
 VDataHandle::VDataHandle(std::shared_ptr<VDataSlot> slot) : fSlot(std::move(slot)) {}
@@ -60,6 +52,9 @@ void VDataHandle::setString(const VString &value) {
   fSlot->isText = true;
 }
 
+void VDataHandle::set(double value) { setDouble(value); }
+void VDataHandle::set(const VString &value) { setString(value); }
+
 void VDataHandle::setClean() {
   if (!fSlot) return;
   std::lock_guard<std::mutex> guard(fSlot->mutex);
@@ -71,31 +66,6 @@ bool VDataHandle::isClean() const {
   std::lock_guard<std::mutex> guard(fSlot->mutex);
   return fSlot->clean;
 }
-
-// Values are few per node, so they are found by a linear search on the
-// attribute and the element index (-1 for the attribute itself).
-struct VDataBlock::State {
-  struct Entry {
-    VObject attribute;
-    int index;
-    std::shared_ptr<VDataSlot> slot;
-  };
-
-  explicit State(const VDGContext &c) : context(c) {}
-
-  std::shared_ptr<VDataSlot> find(const VObject &attribute, int index, bool make) {
-    std::lock_guard<std::mutex> guard(mutex);
-    for (const Entry &e : entries)
-      if (e.index == index && e.attribute == attribute) return e.slot;
-    if (!make) return nullptr;
-    entries.push_back({attribute, index, std::make_shared<VDataSlot>()});
-    return entries.back().slot;
-  }
-
-  std::mutex mutex;
-  std::vector<Entry> entries;
-  VDGContext context;
-};
 
 namespace {
 
@@ -115,21 +85,37 @@ VDataHandle VDataBlock::inputValue(const VObject &attribute, VStatus *ReturnStat
   return inputValue(VPlug(VObject(), attribute), ReturnStatus);
 }
 
+// A bound block asks its node first: for a read, to bring the value up to
+// date; for a write, whether the node has the attribute. Elements are the
+// block's own.
 VDataHandle VDataBlock::inputValue(const VPlug &plug, VStatus *ReturnStatus) {
+  return value(plug, true, ReturnStatus);
+}
+
+VDataHandle VDataBlock::outputValue(const VObject &attribute, VStatus *ReturnStatus) {
+  return outputValue(VPlug(VObject(), attribute), ReturnStatus);
+}
+
+VDataHandle VDataBlock::outputValue(const VPlug &plug, VStatus *ReturnStatus) {
+  return value(plug, false, ReturnStatus);
+}
+
+VDataHandle VDataBlock::value(const VPlug &plug, bool forRead, VStatus *ReturnStatus) const {
   if (plug.isNull()) {
     if (ReturnStatus) *ReturnStatus = nullAttribute();
     return VDataHandle();
   }
-  if (ReturnStatus) *ReturnStatus = VStatus::kSuccess;
+  VStatus status;
+  std::shared_ptr<DataBlockOwner> owner = fState->owner.lock();
+  if (owner && !plug.isElement()) {
+    status = forRead ? owner->prepareRead(plug.attribute()) : owner->checkAttribute(plug.attribute());
+    if (status == VStatus::kInvalidParameter) {
+      if (ReturnStatus) *ReturnStatus = status;
+      return VDataHandle();
+    }
+  }
+  if (ReturnStatus) *ReturnStatus = status;
   return VDataHandle(fState->find(plug.attribute(), plug.logicalIndex(), true));
-}
-
-VDataHandle VDataBlock::outputValue(const VObject &attribute, VStatus *ReturnStatus) {
-  return inputValue(attribute, ReturnStatus);
-}
-
-VDataHandle VDataBlock::outputValue(const VPlug &plug, VStatus *ReturnStatus) {
-  return inputValue(plug, ReturnStatus);
 }
 
 VStatus VDataBlock::setClean(const VObject &attribute) {

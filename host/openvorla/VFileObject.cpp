@@ -1,6 +1,8 @@
 // VFileObject: file names split into directory and name.
 #include <openvorla/VFileObject.h>
 
+#include <cctype>
+#include <cstdlib>
 #include <string>
 
 OPENVORLA_NAMESPACE_OPEN
@@ -36,6 +38,51 @@ VStatus VFileObject::setRawFullName(const VString &fullName) {
 VString VFileObject::rawName() const { return fName; }
 VString VFileObject::rawPath() const { return fPath; }
 VString VFileObject::rawFullName() const { return fPath + fName; }
+
+namespace {
+
+bool isNameChar(char c) { return std::isalnum(static_cast<unsigned char>(c)) || c == '_'; }
+
+std::string environment(const std::string &name) {
+  const char *value = std::getenv(name.c_str());
+  return value ? value : "";
+}
+
+}  // namespace
+
+VString VFileObject::expandedFullName() const {
+  std::string raw = rawFullName().asUTF8(), out;
+  std::string::size_type i = 0;
+  if (raw.compare(0, 2, "~/") == 0) {
+    out = environment("HOME");
+    i = 1;
+  }
+  while (i < raw.size()) {
+    if (raw[i] != '$') {
+      out += raw[i++];
+      continue;
+    }
+    std::string::size_type start = i + 1, end;
+    if (start < raw.size() && raw[start] == '{') {
+      end = raw.find('}', start);
+      if (end == std::string::npos) {  // not a variable: kept as written
+        out += raw.substr(i);
+        break;
+      }
+      out += environment(raw.substr(start + 1, end - start - 1));
+      i = end + 1;
+    } else {
+      for (end = start; end < raw.size() && isNameChar(raw[end]); ++end) {
+      }
+      if (end == start)
+        out += '$';
+      else
+        out += environment(raw.substr(start, end - start));
+      i = end;
+    }
+  }
+  return out.c_str();
+}
 
 VString VFileObject::extension() const {
   std::string name = fName.asUTF8();

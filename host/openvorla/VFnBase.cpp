@@ -8,6 +8,7 @@ VFnBase::VFnBase(const VObject &object) : fObject(object) {}
 VFnBase::~VFnBase() = default;
 VFn::Type VFnBase::type() const { return VFn::kBase; }
 VObject VFnBase::object() const { return fObject; }
+void VFnBase::setObject(const VObject &object) { fObject = object; }
 bool VFnBase::hasObj(VFn::Type type) const { return type == this->type(); }
 
 OPENVORLA_NAMESPACE_CLOSE

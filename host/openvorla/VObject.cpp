@@ -3,31 +3,39 @@
 
 #include <standin/Objects.h>
 
-#include <atomic>
-#include <string>
 #include <utility>
+
+#include "ObjectRecords.h"
 
 OPENVORLA_NAMESPACE_OPEN
 
-struct VObject::Record {
-  std::atomic<int> refs{1};
-  VFn::Type type;
-  std::string name;
-};
+VObject VObjectFactory::make(VFn::Type type, const char *name) {
+  VObject object;
+  object.fRecord = new VObject::Record(type, name);
+  if (type == VFn::kAttribute) object.fRecord->attribute.briefName = object.fRecord->name;
+  return object;
+}
 
-// The one place that makes records; reached through the stand-in's factory.
-class VObjectFactory {
-public:
-  static VObject make(VFn::Type type, const char *name) {
-    VObject object;
-    object.fRecord = new VObject::Record{{1}, type, name ? name : ""};
-    return object;
-  }
+const char *VObjectFactory::name(const VObject &object) {
+  return object.fRecord ? object.fRecord->name.c_str() : "";
+}
 
-  static const char *name(const VObject &object) {
-    return object.fRecord ? object.fRecord->name.c_str() : "";
-  }
-};
+bool VObjectFactory::attributeInfo(const VObject &object, AttributeInfo *info) {
+  VObject::Record *record = object.fRecord;
+  if (!record || record->type != VFn::kAttribute) return false;
+  std::lock_guard<std::mutex> guard(record->mutex);
+  *info = record->attribute;
+  return true;
+}
+
+bool VObjectFactory::updateAttribute(const VObject &object,
+                                     const std::function<void(AttributeInfo &)> &change) {
+  VObject::Record *record = object.fRecord;
+  if (!record || record->type != VFn::kAttribute) return false;
+  std::lock_guard<std::mutex> guard(record->mutex);
+  change(record->attribute);
+  return true;
+}
 
 VObject::VObject() : fRecord(nullptr) {}
 

@@ -9,23 +9,41 @@
 
 #include <algorithm>
 #include <mutex>
+#include <string>
 #include <utility>
 #include <vector>
+
+#include "ObjectRecords.h"
 
 OPENVORLA_NAMESPACE_OPEN
 
 namespace {
 
-// The declarations of the node type whose initializer runs. The host registers
-// one type at a time.
+// The declarations of the node type whose initializer runs. The host
+// initializes one type at a time, between beginNodeType() and endNodeType().
 struct NodeTypeDeclarations {
   std::mutex mutex;
+  bool open = false;
   std::vector<VObject> attributes;
   std::vector<std::pair<VObject, VObject>> affects;
   bool inherits = false;
+  std::string parent;
 
   bool has(const VObject &attr) {
     return std::find(attributes.begin(), attributes.end(), attr) != attributes.end();
+  }
+
+  // The attribute added before under one of the new one's names, if any.
+  const VObject *nameClash(const AttributeInfo &added, const std::string &name) {
+    for (const VObject &a : attributes) {
+      AttributeInfo info;
+      VObjectFactory::attributeInfo(a, &info);
+      std::string other = VObjectFactory::name(a);
+      if (other == name || other == added.briefName || info.briefName == name ||
+          info.briefName == added.briefName)
+        return &a;
+    }
+    return nullptr;
   }
 };
 
@@ -38,6 +56,16 @@ bool isAttribute(const VObject &object) { return object.apiType() == VFn::kAttri
 
 VStatus notAnAttribute() {
   return VStatus(VStatus::kInvalidParameter, "The object is not an attribute");
+}
+
+VStatus notDeclaring() {
+  return VStatus(VStatus::kFailure,
+                 "No node type is being initialized: attributes are declared in the "
+                 "initializer of a node type");
+}
+
+VString quotedName(const VObject &attr) {
+  return VString("'") + VObjectFactory::name(attr) + "'";
 }
 
 }  // namespace
@@ -164,8 +192,15 @@ VStatus VPxNode::addAttribute(const VObject &attr) {
   if (!isAttribute(attr)) return notAnAttribute();
   NodeTypeDeclarations &d = declarations();
   std::lock_guard<std::mutex> guard(d.mutex);
+  if (!d.open) return notDeclaring();
   if (d.has(attr))
     return VStatus(VStatus::kInvalidParameter, "The attribute has already been added");
+  AttributeInfo info;
+  VObjectFactory::attributeInfo(attr, &info);
+  if (const VObject *clash = d.nameClash(info, VObjectFactory::name(attr)))
+    return VStatus(VStatus::kInvalidParameter, VString("The attribute ") + quotedName(attr) +
+                                                   " has a name of the attribute " +
+                                                   quotedName(*clash) + " added before");
   d.attributes.push_back(attr);
   return VStatus::kSuccess;
 }
@@ -174,6 +209,7 @@ VStatus VPxNode::removeAttribute(const VObject &attr) {
   if (!isAttribute(attr)) return notAnAttribute();
   NodeTypeDeclarations &d = declarations();
   std::lock_guard<std::mutex> guard(d.mutex);
+  if (!d.open) return notDeclaring();
   auto it = std::find(d.attributes.begin(), d.attributes.end(), attr);
   if (it == d.attributes.end())
     return VStatus(VStatus::kInvalidParameter, "The attribute has not been added");
@@ -185,12 +221,17 @@ VStatus VPxNode::removeAttribute(const VObject &attr) {
   return VStatus::kSuccess;
 }
 
-// Inherited attributes (the static ones of the base classes among them) may
-// be named too, so the attributes need not have been added here.
+// A type that inherits its parent's attributes may name those too, which it
+// has not added itself.
 VStatus VPxNode::attributeAffects(const VObject &whenChanges, const VObject &isAffected) {
   if (!isAttribute(whenChanges) || !isAttribute(isAffected)) return notAnAttribute();
   NodeTypeDeclarations &d = declarations();
   std::lock_guard<std::mutex> guard(d.mutex);
+  if (!d.open) return notDeclaring();
+  for (const VObject *attr : {&whenChanges, &isAffected})
+    if (!d.inherits && !d.has(*attr))
+      return VStatus(VStatus::kInvalidParameter, VString("The attribute ") + quotedName(*attr) +
+                                                     " has not been added to the node type");
   auto pair = std::make_pair(whenChanges, isAffected);
   if (std::find(d.affects.begin(), d.affects.end(), pair) == d.affects.end())
     d.affects.push_back(pair);
@@ -206,10 +247,12 @@ VStatus VPxNode::inheritAttributesFrom(const VString &parentClassName) {
     return VStatus(VStatus::kInvalidParameter, "No plug-in node type of that name is registered");
   NodeTypeDeclarations &d = declarations();
   std::lock_guard<std::mutex> guard(d.mutex);
+  if (!d.open) return notDeclaring();
   if (d.inherits || !d.attributes.empty())
     return VStatus(VStatus::kFailure,
                    "Attributes are inherited once, before any attribute is added");
   d.inherits = true;
+  d.parent = parentClassName.asUTF8();
   return VStatus::kSuccess;
 }
 
@@ -250,9 +293,23 @@ void setNodeIdentity(VPxNode &node, const VObject &object, const char *typeName,
 void beginNodeType() {
   NodeTypeDeclarations &d = declarations();
   std::lock_guard<std::mutex> guard(d.mutex);
+  d.open = true;
   d.attributes.clear();
   d.affects.clear();
   d.inherits = false;
+  d.parent.clear();
+}
+
+void endNodeType() {
+  NodeTypeDeclarations &d = declarations();
+  std::lock_guard<std::mutex> guard(d.mutex);
+  d.open = false;
+}
+
+NodeTypeDeclaration nodeTypeDeclaration() {
+  NodeTypeDeclarations &d = declarations();
+  std::lock_guard<std::mutex> guard(d.mutex);
+  return NodeTypeDeclaration{d.attributes, d.affects, d.parent};
 }
 
 unsigned int nodeTypeAttributeCount() {

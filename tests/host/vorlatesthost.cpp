@@ -10,6 +10,7 @@
 #include <vector>
 
 #include "director.h"
+#include "graph_hooks.h"
 #include "host_calls.h"
 #include "registry_hooks.h"
 #include "swigrt.h"
@@ -435,6 +436,25 @@ PyMethodDef methods[] = {
     {"create_command", create_command, METH_O, "A command made through its creator."},
     {"delete_node", delete_node, METH_O, "The host deletes a node it made."},
     {"delete_command", delete_command, METH_O, "The host deletes a command it made."},
+    {"graph_create", graph_create, METH_VARARGS, "Makes a node in the graph: its name."},
+    {"graph_delete", graph_delete, METH_O, "Deletes a node of the graph."},
+    {"graph_delete_plugin_nodes", graph_delete_plugin_nodes, METH_O,
+     "Deletes the nodes of a plug-in's types."},
+    {"graph_clear", graph_clear, METH_NOARGS, "Deletes every node of the graph."},
+    {"graph_nodes", graph_nodes, METH_NOARGS, "The graph's nodes, with their compute counts."},
+    {"graph_set", graph_set, METH_VARARGS, "Sets a plug to a number or a string."},
+    {"graph_get", graph_get, METH_O, "A plug's value, computed when dirty."},
+    {"graph_connect", graph_connect, METH_VARARGS, "Connects two plugs."},
+    {"graph_disconnect", graph_disconnect, METH_VARARGS, "Disconnects two plugs."},
+    {"graph_evaluate", graph_evaluate, METH_O, "Computes the dirty values on n threads."},
+    {"graph_threads", graph_threads, METH_NOARGS, "The threads the last evaluation used."},
+    {"command_run", command_run, METH_VARARGS, "Runs a command: its result as text."},
+    {"command_undo", command_undo, METH_NOARGS, "Undoes the last undoable command."},
+    {"command_redo", command_redo, METH_NOARGS, "Redoes the last undone command."},
+    {"command_flush", command_flush, METH_NOARGS, "Deletes the commands kept for undo."},
+    {"export_scene", export_scene, METH_VARARGS, "Writes a scene through a translator."},
+    {"import_scene", import_scene, METH_VARARGS, "Reads a scene through a translator."},
+    {"round_trip_data", round_trip_data, METH_VARARGS, "Reads, copies, writes a data type."},
     {"string_ids", string_ids, METH_NOARGS, "Resource identifiers made and destroyed."},
     {"alive", counter<standin::aliveCount>, METH_O, "Host objects of a class alive now."},
     {"constructed", counter<standin::constructedCount>, METH_O, "Host objects constructed."},

@@ -77,11 +77,15 @@
 #include <thread>
 #include <type_traits>
 
+#include "selftest.h"
+
 using namespace OPENVORLA_NAMESPACE;
 
 namespace {
 
 int gFailures = 0;
+
+}  // namespace
 
 void check(bool ok, const char *what, const char *file, int line) {
   if (ok) return;
@@ -89,11 +93,7 @@ void check(bool ok, const char *what, const char *file, int line) {
   std::fprintf(stderr, "%s:%d: check failed: %s\n", file, line, what);
 }
 
-#define CHECK(cond) check(static_cast<bool>(cond), #cond, __FILE__, __LINE__)
-
-bool contains(const std::string &text, const char *part) {
-  return text.find(part) != std::string::npos;
-}
+namespace {
 
 // Runs body on a thread that Python has never seen.
 template <typename F>
@@ -1439,6 +1439,9 @@ int main() {
   testGeometryAndShapes();
   testFileTranslators();
   testInteraction();
+  testAttributeSets();
+  testGraph();
+  testEngines();
 
   Py_InitializeEx(0);
   PyThreadState *mainThread = PyEval_SaveThread();

@@ -182,6 +182,9 @@ CAST_LISTS = {
     '_p_VPxFileTranslator': 1, '_p_VPxEmitterNode': 1, '_p_VPxData': 1, '_p_VDrawInfo': 1,
     '_p_VDGModifier': 1, '_p_VArgParser': 1,
     '_p_m_VFnNurbsSurface__q_const__f_p_VStatus__int': 1,
+    # From the sibling, which derives its attribute and data function sets
+    # from VFnAttribute and VFnData rather than from VFnBase alone.
+    '_p_VFnAttribute': 2, '_p_VFnData': 1,
 }
 SCALARS = ['bool', 'char', 'short', 'int', 'unsigned_char', 'unsigned_int', 'float', 'double',
            'p_float'] + [f'a_{n}__{t}' for n in (2, 3, 4)
@@ -204,7 +207,7 @@ def test_cast_lists():
     expected = dict(CAST_LISTS)
     expected.update({f'_p_{t}': 1 for t in SCALARS + ['a_2__a_2__float']})
     assert {k: len(v) for k, v in derived.items()} == expected
-    assert len(derived) == 40
+    assert len(derived) == 42
     assert sorted(lists['_p_VPxGeometryFilter']) == ['_p_VPxBlendShape', '_p_VPxDeformerNode',
                                                      '_p_VPxSkinCluster']
     assert all(s.startswith('_p_VFn') for s in lists['_p_VFnBase'])

@@ -1,6 +1,11 @@
 // The values of one node's attributes in one evaluation context, reached
 // through data handles. A value is made, 0 and dirty, the first time it is asked
 // for. Copies of a block share its values.
+//
+// The block that the graph passes to a node's compute holds the node's values:
+// inputValue first brings the value up to date (a connected input is taken
+// from its source, which is computed first when dirty), and an attribute that
+// the node does not have is kInvalidParameter with the null handle.
 #pragma once
 
 #include <openvorla/VApiVersion.h>
@@ -39,7 +44,9 @@ public:
   VDGContext context() const;
 
 private:
+  friend class VDataBlockAccess;
   struct State;
+  VDataHandle value(const VPlug &plug, bool forRead, VStatus *ReturnStatus) const;
   std::shared_ptr<State> fState;
 };
 

@@ -32,6 +32,9 @@ public:
   void setInt(int value);
   void setBool(bool value);
   void setString(const VString &value);
+  // setDouble and setString by the value's kind.
+  void set(double value);
+  void set(const VString &value);
 
   // Marks the value as computed; setting a value does not.
   void setClean();

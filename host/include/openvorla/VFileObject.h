@@ -23,6 +23,9 @@ public:
   VString rawName() const;
   VString rawPath() const;
   VString rawFullName() const;
+  // The full name with a leading "~/" and the environment variables named
+  // as $NAME or ${NAME} replaced by their values (unset ones by nothing).
+  VString expandedFullName() const;
   // The name after its last '.', without it; "" when it has none.
   VString extension() const;
   bool isSet() const;  // a name was given

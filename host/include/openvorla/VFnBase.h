@@ -19,6 +19,8 @@ public:
 protected:
   VFnBase();
   explicit VFnBase(const VObject &object);  // attached to the object
+  // Attaches the function set to another object; the null object detaches it.
+  void setObject(const VObject &object);
 
 private:
   VObject fObject;

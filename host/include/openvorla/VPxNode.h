@@ -156,15 +156,19 @@ public:
   void setMPSafe(bool flag);
 
   // For the initializer of a node type: the attributes of the type being
-  // registered and the dependencies between them. kInvalidParameter for a
-  // null object or one that is not an attribute, and for adding an attribute
-  // twice or removing one that was not added.
+  // registered and the dependencies between them. kFailure outside an
+  // initializer. kInvalidParameter for a null object or one that is not an
+  // attribute, for adding an attribute twice or one whose long or brief name
+  // another attribute of the type has, for removing one that was not added,
+  // and for naming an attribute the type has not added in attributeAffects
+  // (unless the type inherits attributes).
   static VStatus addAttribute(const VObject &attr);
   static VStatus removeAttribute(const VObject &attr);
   static VStatus attributeAffects(const VObject &whenChanges, const VObject &isAffected);
   static VStatus attributeAffects(const VPlug &whenChanges, const VPlug &isAffected);
   // Gives the type being registered the attributes of a registered plug-in
-  // node type; kInvalidParameter for a name that is not registered.
+  // node type, before its own; kInvalidParameter for a name that is not
+  // registered.
   static VStatus inheritAttributesFrom(const VString &parentClassName);
   static const char *className();
 

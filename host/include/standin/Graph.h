@@ -88,6 +88,11 @@ class OPENVORLA_EXPORT Commands {
   Impl *impl_;
 };
 
+// The current command result as text: a number as the shortest text that
+// reads back as it, the elements of an array separated by single blanks, ""
+// for no result.
+OPENVORLA_EXPORT std::string commandResultText();
+
 // Scene files through registered file translators: the translator's writer
 // and reader run with the file named by `path`.
 class OPENVORLA_EXPORT Files {

@@ -7,6 +7,10 @@
 #include <openvorla/VPxNode.h>
 #include <openvorla/VTypeId.h>
 
+#include <string>
+#include <utility>
+#include <vector>
+
 namespace standin {
 
 // What thisVObject(), name(), typeName() and typeId() report for the node.
@@ -16,11 +20,22 @@ OPENVORLA_EXPORT void setNodeIdentity(OPENVORLA_NAMESPACE::VPxNode &node,
                                       const OPENVORLA_NAMESPACE::VTypeId &typeId);
 
 // Starts the declarations of a new node type: forgets the attributes and
-// dependencies declared so far.
+// dependencies declared so far. VPxNode::addAttribute and attributeAffects
+// fail outside the declarations of a type.
 OPENVORLA_EXPORT void beginNodeType();
+// Ends them; what was declared stays readable until the next type begins.
+OPENVORLA_EXPORT void endNodeType();
 OPENVORLA_EXPORT unsigned int nodeTypeAttributeCount();
 OPENVORLA_EXPORT bool nodeTypeHasAttribute(const OPENVORLA_NAMESPACE::VObject &attribute);
 OPENVORLA_EXPORT bool nodeTypeAffects(const OPENVORLA_NAMESPACE::VObject &whenChanges,
                                       const OPENVORLA_NAMESPACE::VObject &isAffected);
+
+// Everything the last node type declared, in the order it was declared.
+struct NodeTypeDeclaration {
+  std::vector<OPENVORLA_NAMESPACE::VObject> attributes;
+  std::vector<std::pair<OPENVORLA_NAMESPACE::VObject, OPENVORLA_NAMESPACE::VObject>> affects;
+  std::string parent;  // the type it inherits its attributes from; "" for none
+};
+OPENVORLA_EXPORT NodeTypeDeclaration nodeTypeDeclaration();
 
 }  // namespace standin

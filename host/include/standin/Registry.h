@@ -5,6 +5,7 @@
 
 #include <openvorla/VPxCommand.h>
 #include <openvorla/VPxData.h>
+#include <openvorla/VPxFileTranslator.h>
 #include <openvorla/VPxNode.h>
 #include <openvorla/VStatus.h>
 #include <openvorla/VString.h>
@@ -50,7 +51,11 @@ OPENVORLA_EXPORT std::vector<RegistrationInfo> registrations();
 // unknown or the creator failed (a script's failure is in the log).
 OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxNode *createNode(
     const OPENVORLA_NAMESPACE::VString &typeName);
-// Starts the declarations of the type and runs its initializer.
+// A number that names the registration of the node type: it changes when
+// the type is registered anew (by a reloaded plug-in, say); 0 when no type
+// of that name is registered.
+OPENVORLA_EXPORT unsigned long nodeTypeSerial(const OPENVORLA_NAMESPACE::VString &typeName);
+// Starts the declarations of the type, runs its initializer and ends them.
 OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VStatus initializeNode(
     const OPENVORLA_NAMESPACE::VString &typeName);
 // A new command of a registered command, constraint command or tool command.
@@ -58,12 +63,17 @@ OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxCommand *createCommand(
     const OPENVORLA_NAMESPACE::VString &commandName);
 OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxData *createData(
     const OPENVORLA_NAMESPACE::VTypeId &typeId);
+OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxData *createData(
+    const OPENVORLA_NAMESPACE::VString &typeName);
+OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxFileTranslator *createTranslator(
+    const OPENVORLA_NAMESPACE::VString &translatorName);
 
 // Deletion as the host does it: through the virtual destructor, without the
 // interpreter lock.
 OPENVORLA_EXPORT void deleteNode(OPENVORLA_NAMESPACE::VPxNode *node);
 OPENVORLA_EXPORT void deleteCommand(OPENVORLA_NAMESPACE::VPxCommand *command);
 OPENVORLA_EXPORT void deleteData(OPENVORLA_NAMESPACE::VPxData *data);
+OPENVORLA_EXPORT void deleteTranslator(OPENVORLA_NAMESPACE::VPxFileTranslator *translator);
 
 // How many times VFnPlugin::setRegisteringCallableScript() was called since
 // the last reset.

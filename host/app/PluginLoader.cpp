@@ -1,0 +1,179 @@
+// The plug-in loader: a plug-in is a Python file that defines
+// initializePlugin(obj) and uninitializePlugin(obj); obj is the plug-in's
+// object, which the plug-in hands to VFnPlugin to register what it provides.
+#include "Application.h"
+
+#include <openvorla/VFnPlugin.h>
+#include <openvorla/VObject.h>
+#include <scriptrunner/TpythonInterpreter.h>
+#include <standin/Graph.h>
+#include <standin/Plugins.h>
+
+#include <algorithm>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+
+using OPENVORLA_NAMESPACE::VFnPlugin;
+using OPENVORLA_NAMESPACE::VObject;
+using OPENVORLA_NAMESPACE::VStatus;
+
+namespace vorla {
+namespace {
+
+struct LoadedPlugin {
+  std::string file;  // absolute
+  VObject object;
+  PyObject *module;  // owned
+};
+
+// Guarded by the interpreter lock, which every caller holds.
+std::vector<LoadedPlugin> &loaded() {
+  static std::vector<LoadedPlugin> plugins;
+  return plugins;
+}
+
+// The current name: a plug-in may rename itself through VFnPlugin::setName.
+std::string nameOf(VObject object) { return VFnPlugin(object).name().asUTF8(); }
+
+void reportPythonException() { TpythonInterpreter::interpreter().catchAndReportException(); }
+
+// Executes the file as a new module, entered in sys.modules under `name` so
+// that the plug-in's classes know their module. The file is compiled here
+// rather than by the import system, so that a traceback starts in the
+// plug-in. New reference, or null with the Python error set and sys.modules
+// as it was.
+PyObject *importFile(const std::string &name, const std::string &file) {
+  std::ifstream in(file, std::ios::binary);
+  std::string source((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+  PyObject *util = PyImport_ImportModule("importlib.util");
+  PyObject *spec =
+      util ? PyObject_CallMethod(util, "spec_from_file_location", "ss", name.c_str(), file.c_str())
+           : nullptr;
+  PyObject *module = spec ? PyObject_CallMethod(util, "module_from_spec", "O", spec) : nullptr;
+  Py_XDECREF(spec);
+  Py_XDECREF(util);
+  PyObject *modules = PyImport_GetModuleDict();  // borrowed
+  if (!module || PyDict_SetItemString(modules, name.c_str(), module) < 0) {
+    Py_XDECREF(module);
+    return nullptr;
+  }
+  PyObject *code = Py_CompileString(source.c_str(), file.c_str(), Py_file_input);
+  PyObject *globals = PyModule_GetDict(module);  // borrowed
+  PyObject *done = code ? PyEval_EvalCode(code, globals, globals) : nullptr;
+  Py_XDECREF(code);
+  if (done) {
+    Py_DECREF(done);
+    return module;
+  }
+  PyObject *type, *value, *traceback;
+  PyErr_Fetch(&type, &value, &traceback);
+  if (PyDict_DelItemString(modules, name.c_str()) < 0) PyErr_Clear();
+  PyErr_Restore(type, value, traceback);
+  Py_DECREF(module);
+  return nullptr;
+}
+
+// Calls module.<function>(obj) with the plug-in's object wrapped as an
+// OpenVorla.VObject. A module without the function is an error, unless
+// `optional`. False with the Python error set when the call fails.
+bool callEntry(PyObject *module, const char *function, const std::string &name, bool optional) {
+  if (optional && !PyObject_HasAttrString(module, function)) return true;
+  PyObject *vpx = PyImport_ImportModule("openvorla.OpenVorlaVPx");
+  PyObject *fnPlugin = vpx ? PyObject_GetAttrString(vpx, "VFnPlugin") : nullptr;
+  Py_XDECREF(vpx);
+  PyObject *object =
+      fnPlugin ? PyObject_CallMethod(fnPlugin, "findPlugin", "s", name.c_str()) : nullptr;
+  Py_XDECREF(fnPlugin);
+  PyObject *result = object ? PyObject_CallMethod(module, function, "O", object) : nullptr;
+  Py_XDECREF(object);
+  Py_XDECREF(result);
+  return result != nullptr;
+}
+
+void forgetModule(PyObject *module) {
+  PyObject *name = PyModule_GetNameObject(module);
+  PyObject *modules = PyImport_GetModuleDict();
+  if (name && PyDict_GetItemWithError(modules, name) == module) PyDict_DelItem(modules, name);
+  Py_XDECREF(name);
+  PyErr_Clear();
+  Py_DECREF(module);
+}
+
+// The host's objects that run a plug-in's code: the nodes of its types,
+// found through its registrations (so before it deregisters them), and, when
+// it unloads, the commands kept for undo, which may be its own.
+void deleteObjectsOf(const std::string &name, bool commandsToo) {
+  withoutInterpreterLock([&] {
+    if (commandsToo) standin::Commands::instance().flush();
+    standin::Graph::instance().deleteNodesOfPlugin(name);
+    return 0;
+  });
+}
+
+// Forgets the plug-in and whatever it left registered.
+void forgetPlugin(const VObject &object) {
+  withoutInterpreterLock([&] {
+    standin::unloadPlugin(object);
+    return 0;
+  });
+}
+
+}  // namespace
+
+std::string loadPlugin(const std::string &file, std::string *name) {
+  namespace fs = std::filesystem;
+  std::error_code error;
+  fs::path path = fs::weakly_canonical(fs::absolute(file), error);
+  if (error || !fs::is_regular_file(path)) return "No plug-in file '" + file + "'";
+  for (const LoadedPlugin &plugin : loaded())
+    if (plugin.file == path.string())
+      return "The plug-in '" + nameOf(plugin.object) + "' is loaded from '" + file + "' already";
+
+  VObject object = standin::loadPlugin(path.stem().c_str(), path.parent_path().c_str());
+  *name = nameOf(object);
+  PyObject *module = importFile(*name, path.string());
+  if (!module) {
+    reportPythonException();
+    forgetPlugin(object);
+    return "The plug-in file '" + file + "' failed to import";
+  }
+  if (!callEntry(module, "initializePlugin", *name, false)) {
+    reportPythonException();
+    deleteObjectsOf(*name, false);
+    forgetPlugin(object);
+    forgetModule(module);
+    return "initializePlugin of the plug-in '" + *name + "' failed";
+  }
+  *name = nameOf(object);
+  loaded().push_back({path.string(), object, module});
+  return {};
+}
+
+std::string unloadPlugin(const std::string &name) {
+  auto &plugins = loaded();
+  auto it = std::find_if(plugins.begin(), plugins.end(),
+                         [&](const LoadedPlugin &p) { return nameOf(p.object) == name; });
+  if (it == plugins.end()) return "No plug-in named '" + name + "' is loaded";
+  LoadedPlugin plugin = *it;
+  plugins.erase(it);
+  deleteObjectsOf(name, true);
+  // A failing uninitializePlugin is reported; the plug-in goes all the same,
+  // since the host takes back everything it registered.
+  if (!callEntry(plugin.module, "uninitializePlugin", name, true)) reportPythonException();
+  forgetPlugin(plugin.object);
+  forgetModule(plugin.module);
+  return {};
+}
+
+void unloadAllPlugins() {
+  while (!loaded().empty()) unloadPlugin(nameOf(loaded().back().object));
+}
+
+std::vector<std::string> loadedPlugins() {
+  std::vector<std::string> names;
+  for (const LoadedPlugin &plugin : loaded()) names.push_back(nameOf(plugin.object));
+  return names;
+}
+
+}  // namespace vorla

@@ -1,0 +1,327 @@
+// The host scripting module `vorla`: what a host script drives the
+// application with. Plugs are named "node.attribute"; attribute values are
+// numbers (floats) or strings. A failing host status raises RuntimeError with
+// the host's text.
+//
+// Every call into the graph, the command engine or the file translators runs
+// with the interpreter lock released: the host calls the plug-ins' Python code
+// from whichever of its threads does the work, and that code takes the lock
+// through TpythonLock as the host's own threads do.
+#include "Application.h"
+
+#include <basekit/Tlog.h>
+#include <standin/Graph.h>
+#include <standin/Lifetime.h>
+#include <standin/Registry.h>
+
+using OPENVORLA_NAMESPACE::VStatus;
+using standin::Commands;
+using standin::Files;
+using standin::Graph;
+
+namespace vorla {
+namespace {
+
+int gDefaultThreads = 1;
+
+// Null with RuntimeError set for a failing status, otherwise None.
+PyObject *statusResult(const VStatus &status) {
+  if (status) Py_RETURN_NONE;
+  PyErr_SetString(PyExc_RuntimeError, status.errorString().asUTF8());
+  return nullptr;
+}
+
+PyObject *textResult(const std::string &error) {
+  if (error.empty()) Py_RETURN_NONE;
+  PyErr_SetString(PyExc_RuntimeError, error.c_str());
+  return nullptr;
+}
+
+PyObject *str(const std::string &text) {
+  return PyUnicode_DecodeUTF8(text.data(), static_cast<Py_ssize_t>(text.size()), "replace");
+}
+
+// A list made of the items, each converted by `make` (a new reference).
+template <class Items, class Make>
+PyObject *listOf(const Items &items, Make make) {
+  PyObject *list = PyList_New(0);
+  for (const auto &item : items) {
+    PyObject *value = list ? make(item) : nullptr;
+    if (!value || PyList_Append(list, value) < 0) {
+      Py_XDECREF(value);
+      Py_XDECREF(list);
+      return nullptr;
+    }
+    Py_DECREF(value);
+  }
+  return list;
+}
+
+bool toValue(PyObject *object, standin::Value *value, const char *function) {
+  if (PyUnicode_Check(object)) {
+    Py_ssize_t size;
+    const char *text = PyUnicode_AsUTF8AndSize(object, &size);
+    if (!text) return false;
+    value->isString = true;
+    value->text.assign(text, static_cast<size_t>(size));
+    return true;
+  }
+  if (PyLong_Check(object) || PyFloat_Check(object)) {  // booleans are integers
+    value->number = PyFloat_AsDouble(object);
+    return !PyErr_Occurred();
+  }
+  PyErr_Format(PyExc_TypeError, "%s() takes numbers and strings, not '%.200s'", function,
+               Py_TYPE(object)->tp_name);
+  return false;
+}
+
+PyObject *fromValue(const standin::Value &value) {
+  return value.isString ? str(value.text) : PyFloat_FromDouble(value.number);
+}
+
+// --- plug-ins and what they registered ---
+
+PyObject *load_plugin(PyObject *, PyObject *args) {
+  const char *file;
+  if (!PyArg_ParseTuple(args, "s:load_plugin", &file)) return nullptr;
+  std::string name;
+  std::string error = loadPlugin(file, &name);
+  if (!error.empty()) return textResult(error);
+  return str(name);
+}
+
+PyObject *unload_plugin(PyObject *, PyObject *args) {
+  const char *name;
+  if (!PyArg_ParseTuple(args, "s:unload_plugin", &name)) return nullptr;
+  return textResult(unloadPlugin(name));
+}
+
+PyObject *plugins(PyObject *, PyObject *) { return listOf(loadedPlugins(), str); }
+
+PyObject *registered(PyObject *, PyObject *) {
+  return listOf(standin::registrations(), [](const standin::RegistrationInfo &r) {
+    return Py_BuildValue("(sss)", r.kind.c_str(), r.name.c_str(), r.plugin.c_str());
+  });
+}
+
+// --- nodes and attributes ---
+
+PyObject *create_node(PyObject *, PyObject *args, PyObject *kwargs) {
+  static const char *keywords[] = {"type", "name", nullptr};
+  const char *type, *name = nullptr;
+  if (!PyArg_ParseTupleAndKeywords(args, kwargs, "s|z:create_node", const_cast<char **>(keywords),
+                                   &type, &name))
+    return nullptr;
+  std::string made;
+  VStatus status = withoutInterpreterLock(
+      [&] { return Graph::instance().createNode(type, name ? name : "", &made); });
+  if (!status) return statusResult(status);
+  return str(made);
+}
+
+PyObject *delete_node(PyObject *, PyObject *args) {
+  const char *name;
+  if (!PyArg_ParseTuple(args, "s:delete_node", &name)) return nullptr;
+  return statusResult(withoutInterpreterLock([&] { return Graph::instance().deleteNode(name); }));
+}
+
+PyObject *nodes(PyObject *, PyObject *) {
+  auto all = withoutInterpreterLock([] { return Graph::instance().nodes(); });
+  return listOf(all, [](const standin::NodeInfo &node) {
+    return Py_BuildValue("(ssl)", node.name.c_str(), node.type.c_str(), node.computeCount);
+  });
+}
+
+PyObject *attributes(PyObject *, PyObject *args) {
+  const char *name;
+  if (!PyArg_ParseTuple(args, "s:attributes", &name)) return nullptr;
+  auto all = withoutInterpreterLock([] { return Graph::instance().nodes(); });
+  for (const standin::NodeInfo &node : all)
+    if (node.name == name) return listOf(node.attributes, str);
+  PyErr_Format(PyExc_RuntimeError, "No node named '%s'", name);
+  return nullptr;
+}
+
+PyObject *set_attr(PyObject *, PyObject *args) {
+  const char *plug;
+  PyObject *object;
+  standin::Value value;
+  if (!PyArg_ParseTuple(args, "sO:set_attr", &plug, &object) ||
+      !toValue(object, &value, "set_attr"))
+    return nullptr;
+  return statusResult(
+      withoutInterpreterLock([&] { return Graph::instance().setAttr(plug, value); }));
+}
+
+PyObject *get_attr(PyObject *, PyObject *args) {
+  const char *plug;
+  if (!PyArg_ParseTuple(args, "s:get_attr", &plug)) return nullptr;
+  standin::Value value;
+  VStatus status = withoutInterpreterLock([&] { return Graph::instance().getAttr(plug, &value); });
+  if (!status) return statusResult(status);
+  return fromValue(value);
+}
+
+PyObject *connect(PyObject *, PyObject *args) {
+  const char *source, *destination;
+  if (!PyArg_ParseTuple(args, "ss:connect", &source, &destination)) return nullptr;
+  return statusResult(
+      withoutInterpreterLock([&] { return Graph::instance().connect(source, destination); }));
+}
+
+PyObject *disconnect(PyObject *, PyObject *args) {
+  const char *source, *destination;
+  if (!PyArg_ParseTuple(args, "ss:disconnect", &source, &destination)) return nullptr;
+  return statusResult(
+      withoutInterpreterLock([&] { return Graph::instance().disconnect(source, destination); }));
+}
+
+PyObject *evaluate(PyObject *, PyObject *args, PyObject *kwargs) {
+  static const char *keywords[] = {"threads", nullptr};
+  PyObject *given = Py_None;
+  if (!PyArg_ParseTupleAndKeywords(args, kwargs, "|O:evaluate", const_cast<char **>(keywords),
+                                   &given))
+    return nullptr;
+  long threads = gDefaultThreads;
+  if (given != Py_None) {
+    threads = PyLong_Check(given) ? PyLong_AsLong(given) : -1;
+    if (PyErr_Occurred()) return nullptr;
+    if (threads < 1 || threads > kMaxThreads) {
+      PyErr_Format(PyExc_ValueError, "evaluate() takes threads=None or 1 to %d", kMaxThreads);
+      return nullptr;
+    }
+  }
+  return statusResult(withoutInterpreterLock(
+      [&] { return Graph::instance().evaluate(static_cast<int>(threads)); }));
+}
+
+PyObject *evaluation_threads(PyObject *, PyObject *) {
+  return listOf(Graph::instance().lastEvaluationThreads(), PyLong_FromLong);
+}
+
+// --- commands ---
+
+PyObject *run_command(PyObject *, PyObject *args) {
+  Py_ssize_t count = PyTuple_GET_SIZE(args);
+  if (count < 1 || !PyUnicode_Check(PyTuple_GET_ITEM(args, 0))) {
+    PyErr_SetString(PyExc_TypeError, "run_command() takes a command name and its arguments");
+    return nullptr;
+  }
+  const char *name = PyUnicode_AsUTF8(PyTuple_GET_ITEM(args, 0));
+  if (!name) return nullptr;
+  std::vector<standin::Value> values(static_cast<size_t>(count - 1));
+  for (Py_ssize_t i = 1; i < count; ++i)
+    if (!toValue(PyTuple_GET_ITEM(args, i), &values[static_cast<size_t>(i - 1)], "run_command"))
+      return nullptr;
+  std::string result;
+  VStatus status =
+      withoutInterpreterLock([&] { return Commands::instance().run(name, values, &result); });
+  if (!status) return statusResult(status);
+  return str(result);
+}
+
+PyObject *undo(PyObject *, PyObject *) {
+  return statusResult(withoutInterpreterLock([] { return Commands::instance().undo(); }));
+}
+
+PyObject *redo(PyObject *, PyObject *) {
+  return statusResult(withoutInterpreterLock([] { return Commands::instance().redo(); }));
+}
+
+// --- files and data ---
+
+PyObject *export_scene(PyObject *, PyObject *args) {
+  const char *path, *translator;
+  if (!PyArg_ParseTuple(args, "ss:export_scene", &path, &translator)) return nullptr;
+  return statusResult(withoutInterpreterLock([&] { return Files::exportScene(path, translator); }));
+}
+
+PyObject *import_scene(PyObject *, PyObject *args) {
+  const char *path, *translator;
+  if (!PyArg_ParseTuple(args, "ss:import_scene", &path, &translator)) return nullptr;
+  return statusResult(withoutInterpreterLock([&] { return Files::importScene(path, translator); }));
+}
+
+PyObject *round_trip_data(PyObject *, PyObject *args) {
+  const char *type, *text;
+  if (!PyArg_ParseTuple(args, "ss:round_trip_data", &type, &text)) return nullptr;
+  std::string written, copied;
+  VStatus status =
+      withoutInterpreterLock([&] { return standin::roundTripData(type, text, &written, &copied); });
+  if (!status) return statusResult(status);
+  return Py_BuildValue("(NN)", str(written), str(copied));
+}
+
+// --- the application's log and its object counts ---
+
+PyObject *log(PyObject *, PyObject *) { return listOf(Tlog::entries(), str); }
+
+PyObject *alive(PyObject *, PyObject *args) {
+  const char *cls;
+  if (!PyArg_ParseTuple(args, "s:alive", &cls)) return nullptr;
+  return PyLong_FromLong(standin::aliveCount(cls));
+}
+
+// The method table keeps every function as a PyCFunction; the flags tell
+// CPython how to call it.
+PyCFunction withKeywords(PyCFunctionWithKeywords function) {
+  return reinterpret_cast<PyCFunction>(reinterpret_cast<void (*)()>(function));
+}
+
+PyMethodDef kFunctions[] = {
+    {"load_plugin", load_plugin, METH_VARARGS,
+     "load_plugin(path) -> name\n\nImports the plug-in file and runs its "
+     "initializePlugin."},
+    {"unload_plugin", unload_plugin, METH_VARARGS,
+     "unload_plugin(name)\n\nDeletes the nodes of the plug-in's types, runs its "
+     "uninitializePlugin\nand forgets what it registered."},
+    {"plugins", plugins, METH_NOARGS, "plugins() -> [name, ...] of the loaded plug-ins"},
+    {"registered", registered, METH_NOARGS,
+     "registered() -> [(kind, name, plugin), ...] of every registration"},
+    {"create_node", withKeywords(create_node), METH_VARARGS | METH_KEYWORDS,
+     "create_node(type, name=None) -> name\n\nWithout a name: <type>1, <type>2, ..."},
+    {"delete_node", delete_node, METH_VARARGS, "delete_node(name)"},
+    {"nodes", nodes, METH_NOARGS, "nodes() -> [(name, type, compute_count), ...]"},
+    {"attributes", attributes, METH_VARARGS,
+     "attributes(node) -> [name, ...] of the node's attributes, as declared"},
+    {"set_attr", set_attr, METH_VARARGS, "set_attr('node.attr', value): a number or a string"},
+    {"get_attr", get_attr, METH_VARARGS,
+     "get_attr('node.attr') -> float or str\n\nAn output is computed when it is dirty."},
+    {"connect", connect, METH_VARARGS, "connect('node.attr', 'other.attr')"},
+    {"disconnect", disconnect, METH_VARARGS, "disconnect('node.attr', 'other.attr')"},
+    {"evaluate", withKeywords(evaluate), METH_VARARGS | METH_KEYWORDS,
+     "evaluate(threads=None)\n\nComputes every dirty output on a pool of host threads "
+     "(default: the\n--threads value)."},
+    {"evaluation_threads", evaluation_threads, METH_NOARGS,
+     "evaluation_threads() -> [0, 1, ...]: the host threads that computed in the last\n"
+     "evaluate(), in the order they first computed"},
+    {"run_command", run_command, METH_VARARGS,
+     "run_command(name, *args) -> result text\n\nArguments are numbers and strings."},
+    {"undo", undo, METH_NOARGS, "undo(): undoes the last undoable command"},
+    {"redo", redo, METH_NOARGS, "redo(): redoes the last undone command"},
+    {"export_scene", export_scene, METH_VARARGS, "export_scene(path, translator)"},
+    {"import_scene", import_scene, METH_VARARGS, "import_scene(path, translator)"},
+    {"round_trip_data", round_trip_data, METH_VARARGS,
+     "round_trip_data(type_name, text) -> (written, copied)\n\nMakes the data type, reads "
+     "it from the text, copies it and writes\nboth back."},
+    {"log", log, METH_NOARGS, "log() -> [entry, ...] of the application's log"},
+    {"alive", alive, METH_VARARGS, "alive(class_name) -> number of live host objects of the class"},
+    {nullptr, nullptr, 0, nullptr}};
+
+PyModuleDef kModule = {PyModuleDef_HEAD_INIT,
+                       "vorla",
+                       "The application's scripting interface: plug-ins, nodes, commands, files.",
+                       -1,
+                       kFunctions,
+                       nullptr,
+                       nullptr,
+                       nullptr,
+                       nullptr};
+
+}  // namespace
+
+void setDefaultThreads(int threads) { gDefaultThreads = threads; }
+
+PyObject *initScriptingModule() { return PyModule_Create(&kModule); }
+
+}  // namespace vorla

@@ -1,0 +1,189 @@
+// The dependency graph's plugs: setting and getting values, connections, and
+// the dirty marks that a change sends downstream.
+#include <standin/Graph.h>
+
+#include <set>
+#include <utility>
+
+#include "AttributeSets.h"
+#include "GraphModel.h"
+
+namespace standin {
+
+using namespace OPENVORLA_NAMESPACE;
+using graph::failure;
+using graph::quoted;
+
+namespace graph {
+
+const Connection *GraphState::incoming(const Node *node, int attribute) const {
+  for (const Connection &c : connections)
+    if (c.destination == node && c.destinationAttribute == attribute) return &c;
+  return nullptr;
+}
+
+// Every value reached is marked, even one already dirty: a compute that did
+// not read a dirty input has left its outputs clean behind it.
+void GraphState::markDirty(Node *node, int attribute) {
+  std::vector<std::pair<Node *, int>> work{{node, attribute}};
+  std::set<std::pair<Node *, int>> seen(work.begin(), work.end());
+  auto reach = [&](Node *n, int a) {
+    if (!seen.insert({n, a}).second) return;
+    n->slots[a]->setClean(false);
+    work.push_back({n, a});
+  };
+  while (!work.empty()) {
+    auto [n, a] = work.back();
+    work.pop_back();
+    for (int affected : n->type->attributes[a].affects) reach(n, affected);
+    for (const Connection &c : connections)
+      if (c.source == n && c.sourceAttribute == a) reach(c.destination, c.destinationAttribute);
+  }
+}
+
+bool GraphState::reaches(const Node *from, const Node *to) const {
+  std::vector<const Node *> work{from};
+  std::set<const Node *> seen{from};
+  while (!work.empty()) {
+    const Node *n = work.back();
+    work.pop_back();
+    if (n == to) return true;
+    for (const Connection &c : connections)
+      if (c.source == n && seen.insert(c.destination).second) work.push_back(c.destination);
+  }
+  return false;
+}
+
+}  // namespace graph
+
+namespace {
+
+const char *holds(bool isString) { return isString ? "a string" : "a number"; }
+
+// The number as the attribute keeps it: of its type, within its range.
+double stored(const graph::AttributeSpec &spec, double value) {
+  value = attributes::numericValue(spec.numericType, value);
+  if (spec.hasMin && value < spec.min) value = spec.min;
+  if (spec.hasMax && value > spec.max) value = spec.max;
+  return value;
+}
+
+}  // namespace
+
+VStatus Graph::setAttr(const std::string &plug, const Value &value) {
+  std::lock_guard<std::mutex> guard(impl_->mutex);
+  graph::NodePtr node;
+  int a;
+  VStatus status = impl_->parsePlug(plug, &node, &a);
+  if (!status) return status;
+  const graph::AttributeSpec &spec = node->type->attributes[a];
+  std::string name = node->plugName(a);
+  if (!spec.writable)
+    return failure(VStatus::kFailure, "The plug " + quoted(name) + " is not writable");
+  if (const graph::Connection *c = impl_->incoming(node.get(), a))
+    return failure(VStatus::kFailure, "The plug " + quoted(name) + " takes its value from " +
+                                          quoted(c->source->plugName(c->sourceAttribute)));
+  if (value.isString != spec.isString)
+    return failure(VStatus::kInvalidParameter, "The plug " + quoted(name) + " holds " +
+                                                   holds(spec.isString) + ", not " +
+                                                   holds(value.isString));
+  if (spec.isString)
+    node->slots[a]->setText(value.text, true);
+  else
+    node->slots[a]->setNumber(stored(spec, value.number), true);
+  impl_->markDirty(node.get(), a);
+  return VStatus::kSuccess;
+}
+
+VStatus Graph::getAttr(const std::string &plug, Value *value) {
+  graph::NodePtr node;
+  int a;
+  {
+    std::lock_guard<std::mutex> guard(impl_->mutex);
+    VStatus status = impl_->parsePlug(plug, &node, &a);
+    if (!status) return status;
+  }
+  VStatus status = impl_->refresh(node, a);
+  if (!status) return status;
+  VDataSlot &slot = *node->slots[a];
+  std::lock_guard<std::mutex> guard(slot.mutex);
+  value->isString = node->type->attributes[a].isString;
+  value->number = value->isString || slot.isText ? 0.0 : slot.number;
+  value->text = value->isString && slot.isText ? slot.text.asUTF8() : "";
+  return VStatus::kSuccess;
+}
+
+VStatus Graph::connect(const std::string &source, const std::string &destination) {
+  graph::NodePtr from, to;
+  int fromAttribute, toAttribute;
+  {
+    std::lock_guard<std::mutex> guard(impl_->mutex);
+    VStatus status = impl_->parsePlug(source, &from, &fromAttribute);
+    if (status) status = impl_->parsePlug(destination, &to, &toAttribute);
+    if (!status) return status;
+    const graph::AttributeSpec &fromSpec = from->type->attributes[fromAttribute];
+    const graph::AttributeSpec &toSpec = to->type->attributes[toAttribute];
+    std::string fromName = from->plugName(fromAttribute), toName = to->plugName(toAttribute);
+    if (!fromSpec.readable)
+      return failure(VStatus::kFailure,
+                     "The plug " + quoted(fromName) + " is not readable: it is no source");
+    if (!toSpec.writable)
+      return failure(VStatus::kFailure,
+                     "The plug " + quoted(toName) + " is not writable: it is no destination");
+    if (fromSpec.isString != toSpec.isString)
+      return failure(VStatus::kInvalidParameter, "Cannot connect " + quoted(fromName) +
+                                                     ", which holds " + holds(fromSpec.isString) +
+                                                     ", to " + quoted(toName) + ", which holds " +
+                                                     holds(toSpec.isString));
+    if (const graph::Connection *c = impl_->incoming(to.get(), toAttribute))
+      return failure(VStatus::kFailure,
+                     c->source == from.get() && c->sourceAttribute == fromAttribute
+                         ? quoted(fromName) + " is already connected to " + quoted(toName)
+                         : "The plug " + quoted(toName) + " already takes its value from " +
+                               quoted(c->source->plugName(c->sourceAttribute)));
+    if (from == to || impl_->reaches(to.get(), from.get()))
+      return failure(VStatus::kFailure, "Connecting " + quoted(fromName) + " to " + quoted(toName) +
+                                            " would make a cycle");
+    impl_->connections.push_back({from.get(), fromAttribute, to.get(), toAttribute});
+    to->slots[toAttribute]->setClean(false);
+    impl_->markDirty(to.get(), toAttribute);
+  }
+  VPlug fromPlug(from->node->thisVObject(), from->type->attributes[fromAttribute].object);
+  VPlug toPlug(to->node->thisVObject(), to->type->attributes[toAttribute].object);
+  // What the nodes answer is theirs to know; the connection stands.
+  graph::guarded([&] { return from->node->connectionMade(fromPlug, toPlug, true); });
+  graph::guarded([&] { return to->node->connectionMade(toPlug, fromPlug, false); });
+  return VStatus::kSuccess;
+}
+
+VStatus Graph::disconnect(const std::string &source, const std::string &destination) {
+  graph::NodePtr from, to;
+  int fromAttribute, toAttribute;
+  {
+    std::lock_guard<std::mutex> guard(impl_->mutex);
+    VStatus status = impl_->parsePlug(source, &from, &fromAttribute);
+    if (status) status = impl_->parsePlug(destination, &to, &toAttribute);
+    if (!status) return status;
+    auto &all = impl_->connections;
+    auto it = all.begin();
+    while (it != all.end() &&
+           !(it->source == from.get() && it->sourceAttribute == fromAttribute &&
+             it->destination == to.get() && it->destinationAttribute == toAttribute))
+      ++it;
+    if (it == all.end())
+      return failure(VStatus::kFailure, quoted(from->plugName(fromAttribute)) +
+                                            " is not connected to " +
+                                            quoted(to->plugName(toAttribute)));
+    all.erase(it);
+    // The destination keeps the value it last took from the source.
+    to->slots[toAttribute]->setClean(true);
+    impl_->markDirty(to.get(), toAttribute);
+  }
+  VPlug fromPlug(from->node->thisVObject(), from->type->attributes[fromAttribute].object);
+  VPlug toPlug(to->node->thisVObject(), to->type->attributes[toAttribute].object);
+  graph::guarded([&] { return from->node->connectionBroken(fromPlug, toPlug, true); });
+  graph::guarded([&] { return to->node->connectionBroken(toPlug, fromPlug, false); });
+  return VStatus::kSuccess;
+}
+
+}  // namespace standin
