@@ -60,10 +60,6 @@ inline bool ReferenceArg(PyObject *obj, swig_type_info *ty, void **out, const ch
   return false;
 }
 
-}  // namespace swigrt
-
-namespace swigrt {
-
 // The setter of a writable static variable: copies the converted value into
 // `target` with T's assignment; 0 on success, 1 with the variable's error set.
 template <class T>
@@ -89,10 +85,6 @@ inline int RefuseVariable(const char *message) {
   SetErrorMessage(ErrorTypeFor(SWIG_AttributeError), message);
   return 1;
 }
-
-}  // namespace swigrt
-
-namespace swigrt {
 
 // A Python object passed where the host expects a function pointer: the host
 // is told, once per callable, just before it is handed over, and takes the

@@ -103,14 +103,16 @@ def _check_present(a: Arg) -> str:
     return f'PyList_Check({slot})'
 
 
-def _result(c: Candidate, call: str) -> str:
-    """Calls the host and makes `resultobj`; a failure returns null."""
+def _result(c: Candidate, call: str, declare: bool = True) -> str:
+    """Calls the host and makes `resultobj` (declaring it, unless the caller
+    already has); a failure returns null."""
     r = c.result
+    target = 'PyObject *resultobj' if declare else 'resultobj'
     if r.kind == 'void':
-        return f'  {call};\n  PyObject *resultobj = Py_NewRef(Py_None);\n'
+        return f'  {call};\n  {target} = Py_NewRef(Py_None);\n'
     if r.kind == 'status':
         return (f'  VStatus result = {call};\n'
-                '  PyObject *resultobj = swigrt::StatusResult(result);\n'
+                f'  {target} = swigrt::StatusResult(result);\n'
                 '  if (!resultobj) return nullptr;\n')
     make = {
         'scalar': lambda: (f'{r.converter}(static_cast<long>({call}))'
@@ -125,7 +127,7 @@ def _result(c: Candidate, call: str) -> str:
         'reference': lambda: (f'swigrt::NewPointerObj(nullptr, const_cast<{r.cpp} *>(&{call}), '
                               f'{r.descriptor.macro}, 0)'),
     }[r.kind]()
-    return f'  PyObject *resultobj = {make};\n  if (!resultobj) return nullptr;\n'
+    return f'  {target} = {make};\n  if (!resultobj) return nullptr;\n'
 
 
 def _after(c: Candidate) -> str:
@@ -181,7 +183,7 @@ def _member_call(cls: str, c: Candidate, values: str) -> str:
                 f'    swigrt::SetErrorMessage(PyExc_RuntimeError, {refused});\n'
                 '    return nullptr;\n  }\n'
                 + ('  const bool upcall = director->swig_get_self() == argv[0];\n' if c.virtual else '')
-                + _guarded(_result(c, call)))
+                + _guarded(_result(c, call, declare=False)))
     if not c.virtual:
         return _result(c, f'{self_ptr}->{c.call}({values})')
     pure = (f'    if (upcall) swigrt::RaisePureVirtual({c_string(f"{c.owner}::{c.call}")});\n'
@@ -191,14 +193,14 @@ def _member_call(cls: str, c: Candidate, values: str) -> str:
     return (f'  auto *director = swigrt::ExactProxy(argv[0], SWIGTYPE_p_{cls}) ? nullptr\n'
             f'                   : dynamic_cast<Swig::Director *>({self_ptr});\n'
             '  const bool upcall = director && director->swig_get_self() == argv[0];\n'
-            + _guarded(_result(c, call), pure))
+            + _guarded(_result(c, call, declare=False), pure))
 
 
 def _guarded(body: str, first: str = '') -> str:
-    """A director exception means the Python error is set already."""
+    """A director exception means the Python error is set already. `body`
+    assigns `resultobj`, declared here outside the guard."""
     inner = first + ''.join(f'  {line}\n' for line in body.rstrip('\n').split('\n'))
-    return ('  PyObject *resultobj = nullptr;\n  try {\n'
-            + inner.replace('  PyObject *resultobj = ', '  resultobj = ')
+    return ('  PyObject *resultobj = nullptr;\n  try {\n' + inner
             + '  } catch (Swig::DirectorException &) {\n    return nullptr;\n  }\n')
 
 

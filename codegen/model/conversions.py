@@ -7,7 +7,7 @@ from typing import Callable
 
 from ..parse import CType, Param
 from .records import Arg, Descriptor, ForwardArg, ForwardResult, Result
-from .naming import GeneratorError, pointer_descriptor_name, spell, unqualified
+from .naming import GeneratorError, spell, unqualified
 
 # Scalar parameter types and the routine that converts each.
 SCALAR_CONVERTERS = {'int': 'AsInt', 'unsigned int': 'AsUnsignedInt', 'short': 'AsShort',
@@ -197,9 +197,6 @@ def result(t: CType, where: str, descriptor_for: DescriptorFor) -> Result:
                       descriptor=descriptor_for(t.inner))
     raise GeneratorError(f'{where}: result of type {spell(t)} has no conversion')
 
-
-def descriptor_name(t: CType) -> tuple[str, str]:
-    return pointer_descriptor_name(t)
 
 
 # --- the host calling Python: forwarding overrides ------------------------------
