@@ -26,7 +26,8 @@ def _convert(a: Arg) -> str:
             call = (f'swigrt::ReferenceArg({slot}, {descriptor}, &argp{n}, '
                     f'{c_string(a.message)}, {c_string(a.null_message)})')
         else:
-            call = (f'swigrt::PointerArg({slot}, {descriptor}, 0, &argp{n}, '
+            flags = 'SWIG_POINTER_DISOWN' if a.disown else '0'
+            call = (f'swigrt::PointerArg({slot}, {descriptor}, {flags}, &argp{n}, '
                     f'{c_string(a.message)})')
         return f'  void *argp{n} = nullptr;\n  if ({present}!{call}) return nullptr;\n'
     if a.kind == 'string':
@@ -211,6 +212,12 @@ def _body(cls: str, ep: EntryPoint, c: Candidate) -> str:
         out += _construct(cls, ep, c, values)
         if ep.refuse_plain and not ep.takes_self:
             return out
+    elif ep.accessor:
+        field = f'static_cast<{cls} *>(argp1)->{c.call}'
+        if ep.accessor == 'get':
+            out += _result(c, field)
+        else:
+            out += f'  {field} = {values};\n  PyObject *resultobj = Py_NewRef(Py_None);\n'
     else:
         out += _member_call(cls, c, values)
     return out + _after(c) + '  return resultobj;\n'

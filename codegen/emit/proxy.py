@@ -36,10 +36,12 @@ class _static_variable:
     """A static variable of the host class, read through the class or an
     instance and written through an instance."""
 
-    def __init__(self, name, get, set=None):
+    def __init__(self, name, get=None, set=None):
         self._name, self._get, self._set = name, get, set
 
     def __get__(self, obj, cls=None):
+        if self._get is None:
+            return getattr(cvar, self._name)
         return self._get()
 
     def __set__(self, obj, value):
@@ -74,6 +76,10 @@ def _class(cls: WrappedClass) -> str:
     if cls.members:
         out.append('\n')
     for m in cls.members:
+        if m.accessor:
+            if m.accessor == 'get':
+                out.append(f'    {m.field} = property(_ext.{m.entry}, _ext.{m.entry[:-4]}_set)\n')
+            continue
         wrap = '_static_method' if m.static else '_instance_method'
         out.append(f'    {m.member} = {wrap}(_ext.{m.entry})\n')
     if cls.director:
@@ -87,9 +93,8 @@ def _class(cls: WrappedClass) -> str:
     if cls.variables:
         out.append('\n')
     for v in cls.variables:
-        setter = 'None' if v.readonly else f'_ext.{v.name}_set'
-        out.append(f'    {v.name[len(n) + 1:]} = _static_variable({v.name!r}, _ext.{v.name}_get, '
-                   f'{setter})\n')
+        accessors = '' if v.readonly else f', _ext.{v.name}_get, _ext.{v.name}_set'
+        out.append(f'    {v.name[len(n) + 1:]} = _static_variable({v.name!r}{accessors})\n')
     out.append(f'\n\n_ext.{n}_swigregister({n})\n')
     return ''.join(out)
 

@@ -14,15 +14,15 @@ def setter(v: GlobalVariable) -> str:
 
 
 def _entry_points(v: GlobalVariable) -> str:
-    out = (f'PyObject *wrap_{v.name}_get(PyObject *, PyObject *args) {{\n'
-           '  PyObject *argv[1];\n'
-           f'  if (!swigrt::UnpackTuple(args, {c_string(v.name + "_get")}, 0, 0, argv)) return nullptr;\n'
-           f'  return {getter(v)}();\n}}\n')
-    if not v.readonly:
-        out += (f'PyObject *wrap_{v.name}_set(PyObject *, PyObject *arg) {{\n'
-                f'  if (!arg || {setter(v)}(arg)) return nullptr;\n'
-                '  Py_RETURN_NONE;\n}\n')
-    return out + '\n'
+    if v.readonly:
+        return ''
+    return (f'PyObject *wrap_{v.name}_get(PyObject *, PyObject *args) {{\n'
+            '  PyObject *argv[1];\n'
+            f'  if (!swigrt::UnpackTuple(args, {c_string(v.name + "_get")}, 0, 0, argv)) return nullptr;\n'
+            f'  return {getter(v)}();\n}}\n'
+            f'PyObject *wrap_{v.name}_set(PyObject *, PyObject *arg) {{\n'
+            f'  if (!arg || {setter(v)}(arg)) return nullptr;\n'
+            '  Py_RETURN_NONE;\n}\n\n')
 
 
 def _pair(v: GlobalVariable) -> str:

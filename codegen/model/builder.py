@@ -4,7 +4,7 @@ from __future__ import annotations
 import codecs
 
 from ..manifest import Manifest
-from ..parse import Class, CType, Function, Headers
+from ..parse import Class, CType, Function, Headers, Param, Variable
 from . import conversions
 from .dispatch import dispatch_rules
 from .records import (METH_NOARGS, METH_O, METH_VARARGS, Candidate, Cast, Companion, Constant,
@@ -169,10 +169,42 @@ class Builder:
                 c.virtual, c.pure = director and fn.virtual, fn.pure
                 c.protected, c.owner = fn.access == 'protected', cls.name
             out.append(ep)
+        for v in cls.variables:
+            if not v.static and v.access == 'public':
+                out += self.field_accessors(cls, v, director)
         for name in self.m.handwritten.get(cls.name, []):
             # Written in wrap/: only its place in the table and the proxy class.
             out.append(EntryPoint(f'{cls.name}_{name}', f'wrap_{cls.name}_{name}', METH_VARARGS,
                                   [], member=name))
+        return out
+
+    def field_accessors(self, cls: Class, v: Variable, director: bool) -> list[EntryPoint]:
+        """A public data member is read and written through `<Class>_<m>_get`
+        and `<Class>_<m>_set`, on which the proxy class builds a property. A
+        member of class type is read in place (the wrapper points into the
+        object); a pointer to an object of a class Python may derive from is
+        the host's to delete with its owner, so the setter takes the object
+        over from its wrapper."""
+        directors = {c.name for c in self.m.classes if c.director}
+        out = []
+        for what in ('set', 'get'):
+            entry = f'{cls.name}_{v.name}_{what}'
+            args = [conversions.self_argument(cls.name, entry, False,
+                                              self.class_descriptor(cls.name))]
+            if what == 'set':
+                value = conversions.argument(2, 1, Param(v.name, v.type), entry,
+                                             self.descriptor_for, '', cls.name)
+                value.disown = v.type.kind == 'pointer' and v.type.inner.name in directors
+                args.append(value)
+                result = Result('void')
+            else:
+                result = conversions.field_result(v.type, entry, self.descriptor_for)
+            count = len(args)
+            cand = Candidate(f'wrap_{entry}', f'{cls.name}::{v.name}', count, count, args,
+                             result, v.name)
+            out.append(EntryPoint(entry, f'wrap_{entry}', METH_O if count == 1 else METH_VARARGS,
+                                  [cand], member=f'{v.name}_{what}', field=v.name,
+                                  accessor=what))
         return out
 
     def virtual_set(self, name: str) -> list[tuple[str, Function]]:
@@ -309,10 +341,12 @@ class Builder:
                                            c.constructor.flags))
             entries.append(MethodEntry(c.delete_entry, f'wrap_{c.delete_entry}', METH_O))
             entries += [MethodEntry(m.entry, m.function, m.flags) for m in c.members]
-            # Each static variable is also reached through its own functions.
+            # A writable static variable is also reached through its own pair of
+            # functions, on which the proxy class builds a class property; a
+            # read-only one only through cvar.
             for v in c.variables:
-                entries.append(MethodEntry(f'{v.name}_get', f'wrap_{v.name}_get', METH_VARARGS))
                 if not v.readonly:
+                    entries.append(MethodEntry(f'{v.name}_get', f'wrap_{v.name}_get', METH_VARARGS))
                     entries.append(MethodEntry(f'{v.name}_set', f'wrap_{v.name}_set', METH_O))
             if c.director:
                 entries.append(MethodEntry(f'disown_{c.name}', f'wrap_disown_{c.name}', METH_O))

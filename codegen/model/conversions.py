@@ -198,6 +198,13 @@ def result(t: CType, where: str, descriptor_for: DescriptorFor) -> Result:
     raise GeneratorError(f'{where}: result of type {spell(t)} has no conversion')
 
 
+def field_result(t: CType, where: str, descriptor_for: DescriptorFor) -> Result:
+    """A data member read from Python: a member of class type is lent in
+    place, never copied; anything else converts as a result would."""
+    if t.kind == 'record' and t.name not in (STRING, STRING_ARRAY, STATUS):
+        return Result('reference', spell(unqualified(t)), descriptor=descriptor_for(t))
+    return result(t, where, descriptor_for)
+
 
 # --- the host calling Python: forwarding overrides ------------------------------
 

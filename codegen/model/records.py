@@ -55,6 +55,7 @@ class Arg:
     list_messages: tuple[str, str] = ('', '')   # not a list, cannot modify
     is_self: bool = False        # `self` of a member call
     announce: str = ''           # callable: the host function announcing it
+    disown: bool = False         # object: the wrapper gives its object up to the host
 
     @property
     def optional(self) -> bool:
@@ -114,6 +115,8 @@ class EntryPoint:
     refuse_plain: bool = False    # constructors: no plain object may be built
     comparison: bool = False      # == or !=: an operand that does not convert is
                                   # not an error but NotImplemented
+    field: str = ''               # data member accessors: the member's name
+    accessor: str = ''            # 'get' or 'set' for a data member accessor
 
 
 @dataclass
@@ -311,6 +314,15 @@ class DirectorClass:
     @property
     def name(self) -> str:
         return f'SwigDirector_{self.cls}'
+
+    @property
+    def function_count(self) -> int:
+        """The functions the director class itself defines: one constructor per
+        constructor of its class, the destructor, the forwarding overrides and
+        the SwigPublic companions of the protected members it inherits or
+        declares. The inner-table overrides are the director base's and are
+        not counted."""
+        return len(self.constructors) + 1 + len(self.forwards) + len(self.companions)
 
     @property
     def uninitialized(self) -> str:

@@ -37,7 +37,7 @@ def test_descriptors_sorted_by_bytes_with_manifest_types(fixture):
     assert [d.index for d in fixture.descriptors] == list(range(len(names)))
     # Pointer parameters bring _p_VStatus, _p_VString and _p_char; strings and
     # string arrays passed by value or reference bring none.
-    assert names == ['_p_Abstract', '_p_Helper', '_p_Hidden', '_p_Mesh', '_p_Node', '_p_Pair',
+    assert names == ['_p_Abstract', '_p_Helper', '_p_Hidden', '_p_Mesh', '_p_Node', '_p_Pair', '_p_Pod',
                      '_p_Root', '_p_Shape', '_p_VStatus', '_p_VString', '_p_Value', '_p_char',
                      '_p_int', '_p_intPtr']
     assert {d.name: d.readable for d in fixture.descriptors}['_p_Value'] == 'Value *'
@@ -136,15 +136,41 @@ def test_method_table_order_and_flags(fixture):
                           ('Node_parent', METH_O), ('Node_value', METH_O),
                           ('Node_rename', METH_VARARGS), ('Node_names', METH_VARARGS),
                           ('Node_pick', METH_VARARGS),
-                          # Each static variable has its own getter, and a setter when
-                          # it is writable.
+                          # A writable static variable has its own getter and setter; a
+                          # read-only one (identity) is reached through cvar only.
                           ('Node_caching_get', METH_VARARGS), ('Node_caching_set', METH_O),
-                          ('Node_identity_get', METH_VARARGS), ('disown_Node', METH_O),
-                          ('Node_swigregister', METH_O)]
+                          ('disown_Node', METH_O), ('Node_swigregister', METH_O),
+                          ('Node_swiginit', METH_VARARGS)]
     # No director: no disown entry.
-    assert rows[-5:] == [('new_Value', METH_VARARGS), ('delete_Value', METH_O),
-                         ('Value_kEmpty_get', METH_VARARGS),
-                         ('Value_swigregister', METH_O), ('Value_swiginit', METH_VARARGS)]
+    value = rows.index(('new_Value', METH_VARARGS))
+    assert rows[value:value + 4] == [('new_Value', METH_VARARGS), ('delete_Value', METH_O),
+                                     ('Value_swigregister', METH_O),
+                                     ('Value_swiginit', METH_VARARGS)]
+    # Each public data member: a setter taking the value and a getter.
+    assert rows[-8:-2] == [('Pod_count_set', METH_VARARGS), ('Pod_count_get', METH_O),
+                           ('Pod_value_set', METH_VARARGS), ('Pod_value_get', METH_O),
+                           ('Pod_owner_set', METH_VARARGS), ('Pod_owner_get', METH_O)]
+
+
+def test_data_members_lend_class_values_and_hand_over_directors(fixture):
+    pod = {c.name: c for c in fixture.classes}['Pod']
+    by_entry = {m.entry: m.candidates[0] for m in pod.members}
+    assert by_entry['Pod_value_get'].result.kind == 'reference'
+    assert by_entry['Pod_count_get'].result.kind == 'scalar'
+    value = by_entry['Pod_value_set'].args[1]
+    assert (value.reference, value.disown) == (True, False)
+    assert value.message == "in method 'Pod_value_set', argument 2 of type 'Value'"
+    owner = by_entry['Pod_owner_set'].args[1]
+    # The host deletes a node its owner points to: the setter takes it over.
+    assert (owner.reference, owner.disown) == (False, True)
+
+
+def test_director_function_count(fixture):
+    # Constructors, destructor, forwarding overrides and protected companions.
+    counts = {d.cls: (len(d.constructors), len(d.forwards), len(d.companions), d.function_count)
+              for d in fixture.directors}
+    assert counts['Pair'] == (3, 0, 0, 4)
+    assert counts['Abstract'] == (1, 1, 0, 3)
 
 
 def test_python_bases_come_from_the_module_or_an_import(fixture):

@@ -33,10 +33,12 @@ class _static_variable:
     """A static variable of the host class, read through the class or an
     instance and written through an instance."""
 
-    def __init__(self, name, get, set=None):
+    def __init__(self, name, get=None, set=None):
         self._name, self._get, self._set = name, get, set
 
     def __get__(self, obj, cls=None):
+        if self._get is None:
+            return getattr(cvar, self._name)
         return self._get()
 
     def __set__(self, obj, value):
@@ -78,7 +80,7 @@ class Node(object):
     kNone = _ext.Node_kNone
 
     caching = _static_variable('Node_caching', _ext.Node_caching_get, _ext.Node_caching_set)
-    identity = _static_variable('Node_identity', _ext.Node_identity_get, None)
+    identity = _static_variable('Node_identity')
 
 
 _ext.Node_swigregister(Node)
@@ -184,7 +186,23 @@ class Value(object):
 
     __swig_destroy__ = _ext.delete_Value
 
-    kEmpty = _static_variable('Value_kEmpty', _ext.Value_kEmpty_get, None)
+    kEmpty = _static_variable('Value_kEmpty')
 
 
 _ext.Value_swigregister(Value)
+
+class Pod(object):
+    thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")
+    __repr__ = _proxy_repr
+
+    def __init__(self, *args):
+        _ext.Pod_swiginit(self, _ext.new_Pod(*args))
+
+    __swig_destroy__ = _ext.delete_Pod
+
+    count = property(_ext.Pod_count_get, _ext.Pod_count_set)
+    value = property(_ext.Pod_value_get, _ext.Pod_value_set)
+    owner = property(_ext.Pod_owner_get, _ext.Pod_owner_set)
+
+
+_ext.Pod_swigregister(Pod)

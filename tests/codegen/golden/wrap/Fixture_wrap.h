@@ -21,12 +21,13 @@
 #include <sdk/Base.h>
 #include <sdk/Base.h>
 #include <sdk/Base.h>
+#include <sdk/Base.h>
 
 using namespace Acme::Sdk;
 
 namespace Fixture_wrap {
 
-extern swig_type_info *swig_types[15];
+extern swig_type_info *swig_types[16];
 extern swig_module_info swig_module;
 extern PyMethodDef module_methods[];
 extern PyMethodDef proxydoc_methods[];
@@ -37,14 +38,15 @@ extern PyMethodDef proxydoc_methods[];
 #define SWIGTYPE_p_Mesh swig_types[3]
 #define SWIGTYPE_p_Node swig_types[4]
 #define SWIGTYPE_p_Pair swig_types[5]
-#define SWIGTYPE_p_Root swig_types[6]
-#define SWIGTYPE_p_Shape swig_types[7]
-#define SWIGTYPE_p_VStatus swig_types[8]
-#define SWIGTYPE_p_VString swig_types[9]
-#define SWIGTYPE_p_Value swig_types[10]
-#define SWIGTYPE_p_char swig_types[11]
-#define SWIGTYPE_p_int swig_types[12]
-#define SWIGTYPE_p_intPtr swig_types[13]
+#define SWIGTYPE_p_Pod swig_types[6]
+#define SWIGTYPE_p_Root swig_types[7]
+#define SWIGTYPE_p_Shape swig_types[8]
+#define SWIGTYPE_p_VStatus swig_types[9]
+#define SWIGTYPE_p_VString swig_types[10]
+#define SWIGTYPE_p_Value swig_types[11]
+#define SWIGTYPE_p_char swig_types[12]
+#define SWIGTYPE_p_int swig_types[13]
+#define SWIGTYPE_p_intPtr swig_types[14]
 
 PyObject *wrap_new_Node(PyObject *self, PyObject *args);
 PyObject *wrap_delete_Node(PyObject *self, PyObject *args);
@@ -58,7 +60,6 @@ PyObject *wrap_Node_names(PyObject *self, PyObject *args);
 PyObject *wrap_Node_pick(PyObject *self, PyObject *args);
 PyObject *wrap_Node_caching_get(PyObject *self, PyObject *args);
 PyObject *wrap_Node_caching_set(PyObject *self, PyObject *args);
-PyObject *wrap_Node_identity_get(PyObject *self, PyObject *args);
 PyObject *wrap_disown_Node(PyObject *self, PyObject *args);
 PyObject *wrap_Node_swigregister(PyObject *self, PyObject *args);
 PyObject *wrap_new_Shape(PyObject *self, PyObject *args);
@@ -84,8 +85,16 @@ PyObject *wrap_disown_Pair(PyObject *self, PyObject *args);
 PyObject *wrap_Pair_swigregister(PyObject *self, PyObject *args);
 PyObject *wrap_new_Value(PyObject *self, PyObject *args);
 PyObject *wrap_delete_Value(PyObject *self, PyObject *args);
-PyObject *wrap_Value_kEmpty_get(PyObject *self, PyObject *args);
 PyObject *wrap_Value_swigregister(PyObject *self, PyObject *args);
+PyObject *wrap_new_Pod(PyObject *self, PyObject *args);
+PyObject *wrap_delete_Pod(PyObject *self, PyObject *args);
+PyObject *wrap_Pod_count_set(PyObject *self, PyObject *args);
+PyObject *wrap_Pod_count_get(PyObject *self, PyObject *args);
+PyObject *wrap_Pod_value_set(PyObject *self, PyObject *args);
+PyObject *wrap_Pod_value_get(PyObject *self, PyObject *args);
+PyObject *wrap_Pod_owner_set(PyObject *self, PyObject *args);
+PyObject *wrap_Pod_owner_get(PyObject *self, PyObject *args);
+PyObject *wrap_Pod_swigregister(PyObject *self, PyObject *args);
 
 PyObject *get_Node_caching();
 int set_Node_caching(PyObject *value);

@@ -411,4 +411,89 @@ PyObject *wrap_Value_swigregister(PyObject *, PyObject *args) {
   return swigrt::RegisterClass(args, SWIGTYPE_p_Value);
 }
 
+// Pod
+
+PyObject *wrap_new_Pod(PyObject *, PyObject *) {
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pod(), SWIGTYPE_p_Pod, SWIG_POINTER_NEW);
+  return resultobj;
+}
+
+PyObject *wrap_delete_Pod(PyObject *, PyObject *arg) {
+  if (!arg) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pod, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Pod', argument 1 of type 'Pod *'")) return nullptr;
+  delete static_cast<Pod *>(argp1);
+  Py_RETURN_NONE;
+}
+
+PyObject *wrap_Pod_count_set(PyObject *, PyObject *args) {
+  PyObject *argv[2] = {};
+  if (!swigrt::UnpackTuple(args, "Pod_count_set", 2, 2, argv)) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pod, &argp1, "in method 'Pod_count_set', argument 1 of type 'Pod *'", "invalid null reference in method 'Pod_count_set', argument 1 of type 'Pod *'")) return nullptr;
+  int arg2{};
+  if (!swigrt::ScalarArg(swigrt::AsInt(argv[1], &arg2), "in method 'Pod_count_set', argument 2 of type 'int'")) return nullptr;
+  static_cast<Pod *>(argp1)->count = arg2;
+  PyObject *resultobj = Py_NewRef(Py_None);
+  return resultobj;
+}
+
+PyObject *wrap_Pod_count_get(PyObject *, PyObject *arg) {
+  if (!arg) return nullptr;
+  PyObject *argv[1] = {arg};
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pod, &argp1, "in method 'Pod_count_get', argument 1 of type 'Pod *'", "invalid null reference in method 'Pod_count_get', argument 1 of type 'Pod *'")) return nullptr;
+  PyObject *resultobj = PyLong_FromLong(static_cast<long>(static_cast<Pod *>(argp1)->count));
+  if (!resultobj) return nullptr;
+  return resultobj;
+}
+
+PyObject *wrap_Pod_value_set(PyObject *, PyObject *args) {
+  PyObject *argv[2] = {};
+  if (!swigrt::UnpackTuple(args, "Pod_value_set", 2, 2, argv)) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pod, &argp1, "in method 'Pod_value_set', argument 1 of type 'Pod *'", "invalid null reference in method 'Pod_value_set', argument 1 of type 'Pod *'")) return nullptr;
+  void *argp2 = nullptr;
+  if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Value, &argp2, "in method 'Pod_value_set', argument 2 of type 'Value'", "invalid null reference in method 'Pod_value_set', argument 2 of type 'Value'")) return nullptr;
+  static_cast<Pod *>(argp1)->value = *static_cast<Value *>(argp2);
+  PyObject *resultobj = Py_NewRef(Py_None);
+  return resultobj;
+}
+
+PyObject *wrap_Pod_value_get(PyObject *, PyObject *arg) {
+  if (!arg) return nullptr;
+  PyObject *argv[1] = {arg};
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pod, &argp1, "in method 'Pod_value_get', argument 1 of type 'Pod *'", "invalid null reference in method 'Pod_value_get', argument 1 of type 'Pod *'")) return nullptr;
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Value *>(&static_cast<Pod *>(argp1)->value), SWIGTYPE_p_Value, 0);
+  if (!resultobj) return nullptr;
+  return resultobj;
+}
+
+PyObject *wrap_Pod_owner_set(PyObject *, PyObject *args) {
+  PyObject *argv[2] = {};
+  if (!swigrt::UnpackTuple(args, "Pod_owner_set", 2, 2, argv)) return nullptr;
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pod, &argp1, "in method 'Pod_owner_set', argument 1 of type 'Pod *'", "invalid null reference in method 'Pod_owner_set', argument 1 of type 'Pod *'")) return nullptr;
+  void *argp2 = nullptr;
+  if (!swigrt::PointerArg(argv[1], SWIGTYPE_p_Node, SWIG_POINTER_DISOWN, &argp2, "in method 'Pod_owner_set', argument 2 of type 'Node *'")) return nullptr;
+  static_cast<Pod *>(argp1)->owner = static_cast<Node *>(argp2);
+  PyObject *resultobj = Py_NewRef(Py_None);
+  return resultobj;
+}
+
+PyObject *wrap_Pod_owner_get(PyObject *, PyObject *arg) {
+  if (!arg) return nullptr;
+  PyObject *argv[1] = {arg};
+  void *argp1 = nullptr;
+  if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pod, &argp1, "in method 'Pod_owner_get', argument 1 of type 'Pod *'", "invalid null reference in method 'Pod_owner_get', argument 1 of type 'Pod *'")) return nullptr;
+  PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Node *>(static_cast<Pod *>(argp1)->owner), SWIGTYPE_p_Node, 0);
+  if (!resultobj) return nullptr;
+  return resultobj;
+}
+
+PyObject *wrap_Pod_swigregister(PyObject *, PyObject *args) {
+  return swigrt::RegisterClass(args, SWIGTYPE_p_Pod);
+}
+
 }  // namespace Fixture_wrap

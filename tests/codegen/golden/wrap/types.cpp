@@ -20,6 +20,7 @@ swig_type_info type_p_Hidden = {"_p_Hidden", "Hidden *", nullptr, nullptr, nullp
 swig_type_info type_p_Mesh = {"_p_Mesh", "Mesh *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_Node = {"_p_Node", "Node *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_Pair = {"_p_Pair", "Pair *", nullptr, nullptr, nullptr, 0};
+swig_type_info type_p_Pod = {"_p_Pod", "Pod *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_Root = {"_p_Root", "Root *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_Shape = {"_p_Shape", "Shape *", nullptr, nullptr, nullptr, 0};
 swig_type_info type_p_VStatus = {"_p_VStatus", "VStatus *", nullptr, nullptr, nullptr, 0};
@@ -35,6 +36,7 @@ swig_cast_info casts_p_Hidden[] = {{&type_p_Hidden, nullptr, nullptr, nullptr}, 
 swig_cast_info casts_p_Mesh[] = {{&type_p_Mesh, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_Node[] = {{&type_p_Node, nullptr, nullptr, nullptr}, {&type_p_Mesh, cast_p_MeshTo_p_Node, nullptr, nullptr}, {&type_p_Shape, cast_p_ShapeTo_p_Node, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_Pair[] = {{&type_p_Pair, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
+swig_cast_info casts_p_Pod[] = {{&type_p_Pod, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_Root[] = {{&type_p_Root, nullptr, nullptr, nullptr}, {&type_p_Helper, cast_p_HelperTo_p_Root, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_Shape[] = {{&type_p_Shape, nullptr, nullptr, nullptr}, {&type_p_Mesh, cast_p_MeshTo_p_Shape, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
 swig_cast_info casts_p_VStatus[] = {{&type_p_VStatus, nullptr, nullptr, nullptr}, {nullptr, nullptr, nullptr, nullptr}};
@@ -51,6 +53,7 @@ swig_type_info *type_initial[] = {
     &type_p_Mesh,
     &type_p_Node,
     &type_p_Pair,
+    &type_p_Pod,
     &type_p_Root,
     &type_p_Shape,
     &type_p_VStatus,
@@ -68,6 +71,7 @@ swig_cast_info *cast_initial[] = {
     casts_p_Mesh,
     casts_p_Node,
     casts_p_Pair,
+    casts_p_Pod,
     casts_p_Root,
     casts_p_Shape,
     casts_p_VStatus,
@@ -80,7 +84,7 @@ swig_cast_info *cast_initial[] = {
 
 }  // namespace
 
-swig_type_info *swig_types[15];
-swig_module_info swig_module = {swig_types, 14, nullptr, type_initial, cast_initial, nullptr};
+swig_type_info *swig_types[16];
+swig_module_info swig_module = {swig_types, 15, nullptr, type_initial, cast_initial, nullptr};
 
 }  // namespace Fixture_wrap

@@ -30,23 +30,11 @@ int set_Node_identity(PyObject *) {
   return swigrt::RefuseVariable("Variable Node_identity is read-only.");
 }
 
-PyObject *wrap_Node_identity_get(PyObject *, PyObject *args) {
-  PyObject *argv[1];
-  if (!swigrt::UnpackTuple(args, "Node_identity_get", 0, 0, argv)) return nullptr;
-  return get_Node_identity();
-}
-
 PyObject *get_Value_kEmpty() {
   return swigrt::NewPointerObj(nullptr, const_cast<Value *>(&Value::kEmpty), SWIGTYPE_p_Value, 0);
 }
 int set_Value_kEmpty(PyObject *) {
   return swigrt::RefuseVariable("Variable Value_kEmpty is read-only.");
-}
-
-PyObject *wrap_Value_kEmpty_get(PyObject *, PyObject *args) {
-  PyObject *argv[1];
-  if (!swigrt::UnpackTuple(args, "Value_kEmpty_get", 0, 0, argv)) return nullptr;
-  return get_Value_kEmpty();
 }
 
 }  // namespace Fixture_wrap
