@@ -272,6 +272,10 @@ bool VPxNode::addExternalContentForFileAttr(VExternalContentInfoTable &, const V
   return false;
 }
 
+bool VPxNode::addExternalContentForFileAttr(VExternalContentInfoTable &, const VString &) const {
+  return false;
+}
+
 VObject VPxNode::message = standin::makeAttribute("VPxNode.message");
 VObject VPxNode::isHistoricallyInteresting =
     standin::makeAttribute("VPxNode.isHistoricallyInteresting");

@@ -185,6 +185,9 @@ protected:
   bool setExternalContentForFileAttr(const VObject &attr,
                                      const VExternalContentLocationTable &table);
   bool addExternalContentForFileAttr(VExternalContentInfoTable &table, const VObject &attr) const;
+  // The same for the attribute of that long name.
+  bool addExternalContentForFileAttr(VExternalContentInfoTable &table,
+                                     const VString &attrName) const;
 
 private:
   friend class VPxNodeIdentity;
