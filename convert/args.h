@@ -22,7 +22,12 @@ inline bool DirectPointer(PyObject *obj, swig_type_info *ty, void **out) {
       PyErr_Clear();
       return false;
     }
-    Py_DECREF(value);  // the instance keeps its "this" alive
+    // The instance keeps its "this" alive; a value made by the lookup itself
+    // is kept until the call is over.
+    if (Py_REFCNT(value) == 1)
+      KeepForCall(value);
+    else
+      Py_DECREF(value);
     if (Py_TYPE(value) != wrapper) return false;
     obj = value;
   }
@@ -43,14 +48,6 @@ inline bool PointerArg(PyObject *obj, swig_type_info *ty, int flags, void **out,
   return false;
 }
 
-// True when `obj` is an instance of the very class registered for `ty`. A
-// director's Python instance is always of a subclass, so a call with such an
-// object can be no upcall, and the director cross-cast can be skipped.
-inline bool ExactProxy(PyObject *obj, swig_type_info *ty) {
-  auto *data = static_cast<SwigPyClientData *>(ty->clientdata);
-  return data && reinterpret_cast<PyObject *>(Py_TYPE(obj)) == data->klass;
-}
-
 // As PointerArg, for a reference parameter: a null pointer is refused too.
 inline bool ReferenceArg(PyObject *obj, swig_type_info *ty, void **out, const char *message,
                          const char *null_message) {
@@ -65,6 +62,7 @@ inline bool ReferenceArg(PyObject *obj, swig_type_info *ty, void **out, const ch
 template <class T>
 int AssignVariable(PyObject *value, T &target, swig_type_info *ty, const char *message,
                    const char *null_message) {
+  CallScope scope;
   void *argp = nullptr;
   int res = ConvertPtr(value, &argp, ty, 0);
   if (!SWIG_IsOK(res)) {

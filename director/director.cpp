@@ -2,6 +2,8 @@
 // the director exceptions.
 #include "director.h"
 
+#include "swigrt.h"
+
 #include <scriptrunner/TpythonLock.h>
 
 namespace Swig {
@@ -13,6 +15,23 @@ namespace Swig {
 Director::~Director() {
   TpythonLock lock;
   if (swig_disown_flag) Py_XDECREF(swig_self);
+}
+
+void Director::swig_forget_object(void *object) const {
+  // An instance whose last reference is going is being deallocated, and its
+  // wrapper with it; there is nothing left to tell.
+  if (!swig_self || Py_REFCNT(swig_self) <= 0) return;
+  // The generic lookup reads the instance's attributes where they are, also
+  // while a collection is clearing them, and never builds anything.
+  PyObject *type, *value, *traceback;
+  PyErr_Fetch(&type, &value, &traceback);
+  PyObject *wrapper = PyObject_GenericGetAttr(swig_self, swigrt::ThisString());
+  if (wrapper) {
+    swigrt::ForgetPointer(wrapper, object);
+    Py_DECREF(wrapper);
+  }
+  PyErr_Clear();
+  PyErr_Restore(type, value, traceback);
 }
 
 // Each record is made only once its slot is known to be free: a second holder

@@ -26,6 +26,7 @@
 #include <map>
 #include <memory>
 #include <string>
+#include <typeinfo>
 
 namespace Swig {
 
@@ -104,6 +105,11 @@ class Director {
   virtual bool swig_get_inner(const char * /*name*/) const { return true; }
   virtual void swig_set_inner(const char * /*name*/, bool /*value*/) const {}
 
+  // Called by the director class's destructor with the address its wrappers
+  // hold: the Python instance's "this" stops pointing at the object, so that
+  // a plug-in that kept the instance gets an error, not a dangling pointer.
+  void swig_forget_object(void *object) const;
+
   // Keep a text buffer, or the record of an object that an override handed
   // to the host, alive as long as this director. A pointer already recorded
   // keeps its first record.
@@ -117,6 +123,14 @@ class Director {
   PyObject *swig_self;
   mutable bool swig_disown_flag = false;
 };
+
+// The director behind a host object, or null. An object of exactly the host
+// class is none, which the type test tells without the cost of a cross-cast.
+template <class T>
+Director *DirectorOf(T *object) {
+  if (!object || typeid(*object) == typeid(T)) return nullptr;
+  return dynamic_cast<Director *>(object);
+}
 
 // Thrown into the host when a forwarded call cannot produce its result. The
 // Python error indicator carries the same text, so the entry point that

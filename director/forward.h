@@ -9,6 +9,8 @@
 
 #include <scriptrunner/TpythonInterpreter.h>
 
+#include <type_traits>
+
 #include "director.h"
 #include "scalars.h"
 #include "text.h"
@@ -95,9 +97,11 @@ PyObject *CopiedArg(const T &value, swig_type_info *ty) {
 
 // A status: failure after a raising override; code 5 for the very interned
 // "unknown"; success for anything else, equal strings included.
+// Each test interns "unknown" anew and keeps the reference it gets.
 inline StatusType StatusResult(PyObject *result) {
   if (!result) return StatusType(StatusType::kFailure);
-  if ((PyUnicode_Check(result) || PyBytes_Check(result)) && result == UnknownString())
+  if ((PyUnicode_Check(result) || PyBytes_Check(result)) &&
+      result == PyUnicode_InternFromString("unknown"))
     return StatusType(StatusType::kUnknownParameter);
   return StatusType(StatusType::kSuccess);
 }
@@ -124,8 +128,20 @@ T ValueResult(PyObject *result, swig_type_info *ty, const char *message) {
   return value;
 }
 
-// A pointer handed to the host: the Python wrapper gives up its ownership and
-// the director keeps the object alive as long as itself.
+// An object an override hands to the host: its Python wrapper gives up its
+// ownership, the returning director records it, and when it is itself a
+// director it keeps its Python instance alive for as long as the host keeps
+// the object, whether or not the plug-in still refers to it.
+template <class T>
+void HandOver(const Swig::Director *director, T *object, int own) {
+  director->swig_acquire_ownership_obj(const_cast<std::remove_const_t<T> *>(object), own);
+  if constexpr (std::is_polymorphic_v<T>) {
+    if (Swig::Director *handed = Swig::DirectorOf(const_cast<std::remove_const_t<T> *>(object)))
+      handed->swig_disown();
+  }
+}
+
+// A pointer handed to the host (possibly null, for None).
 template <class T>
 T *PointerResult(const Swig::Director *director, PyObject *result, swig_type_info *ty,
                  const char *message) {
@@ -133,7 +149,7 @@ T *PointerResult(const Swig::Director *director, PyObject *result, swig_type_inf
   int own = 0;
   int res = result ? ConvertPtr(result, &ptr, ty, SWIG_POINTER_DISOWN, &own) : SWIG_TypeError;
   if (!SWIG_IsOK(res)) RaiseMismatch(SWIG_ArgError(res), message);
-  director->swig_acquire_ownership_obj(ptr, own);
+  HandOver(director, static_cast<T *>(ptr), own);
   return static_cast<T *>(ptr);
 }
 
@@ -146,7 +162,7 @@ T &ReferenceResult(const Swig::Director *director, PyObject *result, swig_type_i
   int res = result ? ConvertPtr(result, &ptr, ty, SWIG_POINTER_DISOWN, &own) : SWIG_TypeError;
   if (!SWIG_IsOK(res)) RaiseMismatch(SWIG_ArgError(res), message);
   if (!ptr) RaiseMismatch(SWIG_ValueError, null_message);
-  director->swig_acquire_ownership_obj(ptr, own);
+  HandOver(director, static_cast<T *>(ptr), own);
   return *static_cast<T *>(ptr);
 }
 

@@ -215,6 +215,12 @@ PyObject *RegisterClass(PyObject *args, swig_type_info *ty) {
 PyObject *ShadowInit(PyObject *, PyObject *args) {
   PyObject *objs[2] = {nullptr, nullptr};
   if (!UnpackTuple(args, "swiginit", 2, 2, objs)) return nullptr;
+  // A type's attributes are its class's: a "this" stored there would be
+  // found by every instance, the type object itself included.
+  if (PyType_Check(objs[0])) {
+    PyErr_SetString(PyExc_TypeError, "Attempt to set 'this' on a type object");
+    return nullptr;
+  }
   if (SwigPyObject *sthis = GetSwigThis(objs[0])) {
     // A second constructor wrapper for the same instance extends the chain.
     PyObject *result = detail::AppendThis(reinterpret_cast<PyObject *>(sthis), objs[1]);

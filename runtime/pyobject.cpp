@@ -14,6 +14,7 @@
 #include <cstdint>
 #include <cstdio>
 #include <cstring>
+#include <vector>
 
 #include "internal.h"
 #include "swigrt.h"
@@ -69,21 +70,23 @@ PyObject *Next(PyObject *self, PyObject *) {
   return next;
 }
 
+// One text per wrapper of the chain, back to back; built in a loop, since a
+// chain can be far longer than the C stack is deep.
 PyObject *Repr(PyObject *self) {
-  SwigPyObject *sobj = AsWrapper(self);
-  const char *name = PrettyName(sobj->ty);
-  PyObject *text = PyUnicode_FromFormat("<Swig Object of type '%s' at %p>", name ? name : "unknown",
-                                        static_cast<void *>(self));
-  if (!text || !sobj->next) return text;
-  PyObject *rest = Repr(sobj->next);
-  if (!rest) {
-    Py_DECREF(text);
-    return nullptr;
+  _PyUnicodeWriter writer;
+  _PyUnicodeWriter_Init(&writer);
+  for (PyObject *link = self; link; link = AsWrapper(link)->next) {
+    const char *name = PrettyName(AsWrapper(link)->ty);
+    PyObject *text = PyUnicode_FromFormat("<Swig Object of type '%s' at %p>",
+                                          name ? name : "unknown", static_cast<void *>(link));
+    int failed = !text || _PyUnicodeWriter_WriteStr(&writer, text) < 0;
+    Py_XDECREF(text);
+    if (failed) {
+      _PyUnicodeWriter_Dealloc(&writer);
+      return nullptr;
+    }
   }
-  PyObject *joined = PyUnicode_Concat(text, rest);
-  Py_DECREF(text);
-  Py_DECREF(rest);
-  return joined;
+  return _PyUnicodeWriter_Finish(&writer);
 }
 
 PyObject *ReprMethod(PyObject *self, PyObject *) { return Repr(self); }
@@ -146,8 +149,16 @@ void Dealloc(PyObject *self) {
     }
   }
   Py_XDECREF(sobj->table);
-  Py_XDECREF(next);
   PyObject_Free(self);
+  // The rest of the chain, one wrapper at a time: releasing `next` from its
+  // own deallocation would recurse once per link.
+  while (next && Py_REFCNT(next) == 1 && Py_TYPE(next) == SwigPyObject_type()) {
+    PyObject *after = AsWrapper(next)->next;
+    AsWrapper(next)->next = nullptr;
+    Py_DECREF(next);
+    next = after;
+  }
+  Py_XDECREF(next);
 }
 
 PyMethodDef wrapper_methods[] = {
@@ -210,11 +221,36 @@ PyObject *SwigPyObject_New(void *ptr, swig_type_info *ty, int own) {
   return reinterpret_cast<PyObject *>(sobj);
 }
 
+namespace detail {
+
+int call_depth = 0;
+bool have_kept = false;
+std::vector<PyObject *> kept;
+
+void ReleaseKept() {
+  // Releasing may run Python code that calls into the module again and
+  // keeps more: take the list first.
+  while (!kept.empty()) {
+    std::vector<PyObject *> now;
+    now.swap(kept);
+    for (PyObject *obj : now) Py_DECREF(obj);
+  }
+  have_kept = false;
+}
+
+}  // namespace detail
+
+void KeepForCall(PyObject *obj) {
+  detail::kept.push_back(obj);
+  detail::have_kept = true;
+}
+
 SwigPyObject *GetSwigThis(PyObject *obj) {
   // Callers may run with an error already pending (a string argument that
   // failed earlier in the same call); a failed lookup here must neither
   // raise nor swallow that error.
-  while (obj && !SwigPyObject_Check(obj)) {
+  for (int depth = 0; obj && !SwigPyObject_Check(obj); ++depth) {
+    if (depth == kMaxThisDepth) return nullptr;
     PyObject *name = ThisString();
     if (!name) {
       PyErr_Clear();
@@ -226,12 +262,28 @@ SwigPyObject *GetSwigThis(PyObject *obj) {
     if (!next) PyErr_Clear();
     PyErr_Restore(type, value, traceback);
     if (!next) return nullptr;
-    // The instance keeps its "this" alive; a "this" that is itself a proxy
-    // instance is followed to its own "this".
-    Py_DECREF(next);
+    // The instance keeps its "this" alive; a value that only the lookup
+    // holds was made for it and must outlive the call. A "this" that is
+    // itself a proxy instance is followed to its own "this".
+    if (Py_REFCNT(next) == 1) {
+      KeepForCall(next);
+    } else {
+      Py_DECREF(next);
+    }
     obj = next;
   }
   return obj ? AsWrapper(obj) : nullptr;
+}
+
+void ForgetPointer(PyObject *obj, void *ptr) {
+  if (!ptr) return;
+  for (SwigPyObject *sobj = GetSwigThis(obj); sobj;
+       sobj = sobj->next ? AsWrapper(sobj->next) : nullptr) {
+    if (sobj->ptr == ptr) {
+      sobj->ptr = nullptr;
+      sobj->own = 0;
+    }
+  }
 }
 
 int SetSwigThis(PyObject *inst, PyObject *swig_this) {

@@ -169,8 +169,38 @@ PyObject *PyStaticMethod_New(PyObject *self, PyObject *func);
 // --- wrapped pointer objects ------------------------------------------------
 PyObject *SwigPyObject_New(void *ptr, swig_type_info *ty, int own);
 bool SwigPyObject_Check(PyObject *op);
-SwigPyObject *GetSwigThis(PyObject *obj);  // borrowed, never raises
+// The wrapper behind `obj`, borrowed; never raises. A "this" that the lookup
+// itself made (a property returning a fresh wrapper) is kept alive until the
+// outermost CallScope ends, so the pointer read from it stays valid for the
+// call. A chain of "this" longer than kMaxThisDepth (a loop) finds nothing.
+SwigPyObject *GetSwigThis(PyObject *obj);
+constexpr int kMaxThisDepth = 64;
 int SetSwigThis(PyObject *inst, PyObject *swig_this);
+// Makes every wrapper in the chain of `obj` that points at `ptr` point at
+// nothing and own nothing: the object is gone.
+void ForgetPointer(PyObject *obj, void *ptr);
+
+// Takes over a reference that must live until the outermost CallScope ends.
+void KeepForCall(PyObject *obj);
+
+namespace detail {
+extern int call_depth;
+extern bool have_kept;
+void ReleaseKept();
+}  // namespace detail
+
+// Brackets every call into the module (entry points, forwarded calls): the
+// values GetSwigThis had to keep are released when the outermost one ends.
+// Everything runs under the interpreter lock, so plain counters do.
+class CallScope {
+ public:
+  CallScope() { ++detail::call_depth; }
+  ~CallScope() {
+    if (--detail::call_depth == 0 && detail::have_kept) detail::ReleaseKept();
+  }
+  CallScope(const CallScope &) = delete;
+  CallScope &operator=(const CallScope &) = delete;
+};
 PyObject *SwigPyPacked_New(void *ptr, size_t size, swig_type_info *ty);
 bool SwigPyPacked_Check(PyObject *op);
 

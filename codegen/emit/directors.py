@@ -84,7 +84,8 @@ def _convert_result(f: Forward) -> str:
 
 
 def _forward(d: DirectorClass, f: Forward) -> str:
-    out = [f'{_signature(f, d.name + "::")} {{\n  TpythonLock py_lock;\n']
+    out = [f'{_signature(f, d.name + "::")} {{\n  TpythonLock py_lock;\n'
+           '  swigrt::CallScope py_scope;\n']
     if f.arity:
         names = ', '.join(a.name for a in f.args)
         fallback = (f'swigrt::RaisePureVirtual({c_string(f.qualified)})' if f.pure
@@ -117,7 +118,8 @@ def _definitions(d: DirectorClass) -> str:
         out.append(f'{d.name}::{d.name}(PyObject *self{extra})\n'
                    f'    : {d.cls}({names}), Swig::Director(self) {{\n'
                    '  TpythonLock lock;\n}\n\n')
-    out.append(f'{d.name}::~{d.name}() {{\n  TpythonLock lock;\n}}\n\n')
+    out.append(f'{d.name}::~{d.name}() {{\n  TpythonLock lock;\n'
+               f'  swig_forget_object(static_cast<{d.cls} *>(this));\n}}\n\n')
     out += [_forward(d, f) for f in d.forwards]
     return ''.join(out)
 

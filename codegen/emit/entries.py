@@ -8,6 +8,13 @@ from ..model import (METH_NOARGS, METH_O, REFUSE_PLAIN, Arg, Candidate, Dispatch
                      Module, PointerClass, WrappedClass)
 
 
+def _open(function: str, param: str) -> str:
+    """The head of an entry point. Its call scope keeps alive, until the call
+    is over, any "this" that a pointer conversion had to make."""
+    return (f'PyObject *{function}(PyObject *, PyObject *{param}) {{\n'
+            '  swigrt::CallScope scope;\n')
+
+
 def _slot(a: Arg) -> str:
     return f'argv[{a.slot}]'
 
@@ -191,8 +198,7 @@ def _member_call(cls: str, c: Candidate, values: str) -> str:
             if c.pure else '')
     call = (f'{self_ptr}->{c.call}({values})' if c.pure else
             f'(upcall ? {self_ptr}->{cls}::{c.call}({values}) : {self_ptr}->{c.call}({values}))')
-    return (f'  auto *director = swigrt::ExactProxy(argv[0], SWIGTYPE_p_{cls}) ? nullptr\n'
-            f'                   : dynamic_cast<Swig::Director *>({self_ptr});\n'
+    return (f'  Swig::Director *director = Swig::DirectorOf({self_ptr});\n'
             '  const bool upcall = director && director->swig_get_self() == argv[0];\n'
             + _guarded(_result(c, call, declare=False), pure))
 
@@ -241,7 +247,7 @@ def _comparison(cls: str, ep: EntryPoint) -> str:
     c = ep.candidates[0]
     self_arg, other = c.args
     op = '==' if ep.member == '__eq__' else '!='
-    return (f'PyObject *{ep.function}(PyObject *, PyObject *args) {{\n'
+    return (_open(ep.function, 'args') +
             '  PyObject *argv[2] = {};\n'
             f'  if (!swigrt::UnpackTuple(args, {c_string(ep.entry)}, 2, 2, argv)) return nullptr;\n'
             + _convert(self_arg) +
@@ -258,7 +264,7 @@ def entry_point(cls: str, ep: EntryPoint) -> str:
         return _comparison(cls, ep)
 
     def head(param: str) -> str:
-        return f'PyObject *{ep.function}(PyObject *, PyObject *{param}) {{\n'
+        return _open(ep.function, param)
 
     if not ep.dispatch:
         c = ep.candidates[0]
@@ -297,15 +303,17 @@ def _class(cls: WrappedClass) -> str:
     out = [f'// {cls.name}\n\n']
     if cls.constructor:
         out.append(entry_point(cls.name, cls.constructor) + '\n')
-    out.append(f'PyObject *wrap_{cls.delete_entry}(PyObject *, PyObject *arg) {{\n'
+    out.append(_open(f'wrap_{cls.delete_entry}', 'arg') +
                '  if (!arg) return nullptr;\n  void *argp1 = nullptr;\n'
                f'  if (!swigrt::PointerArg(arg, {d}, SWIG_POINTER_DISOWN, &argp1, {msg})) '
                'return nullptr;\n'
-               f'  delete static_cast<{cls.name} *>(argp1);\n  Py_RETURN_NONE;\n}}\n\n')
+               f'  delete static_cast<{cls.name} *>(argp1);\n'
+               '  // The object is gone: a later use through this wrapper is refused.\n'
+               '  swigrt::ForgetPointer(arg, argp1);\n  Py_RETURN_NONE;\n}\n\n')
     out += [entry_point(cls.name, m) + '\n' for m in cls.members if m.candidates]
     if cls.director:
         msg = c_string(f"in method 'disown_{cls.name}', argument 1 of type '{cls.name} *'")
-        out.append(f'PyObject *wrap_disown_{cls.name}(PyObject *, PyObject *arg) {{\n'
+        out.append(_open(f'wrap_disown_{cls.name}', 'arg') +
                    '  if (!arg) return nullptr;\n  void *argp1 = nullptr;\n'
                    f'  if (!swigrt::PointerArg(arg, {d}, 0, &argp1, {msg})) return nullptr;\n'
                    '  // The host keeps the object from now on: its director holds the\n'
@@ -328,7 +336,7 @@ def _pointer_class(p: PointerClass) -> str:
                 f'  {t} *cell = static_cast<{t} *>(argp1);\n')
 
     def one(what: str, body: str) -> str:
-        return (f'PyObject *wrap_{p.entry(what)}(PyObject *, PyObject *arg) {{\n'
+        return (_open(f'wrap_{p.entry(what)}', 'arg') +
                 '  if (!arg) return nullptr;\n  PyObject *argv[1] = {arg};\n' + body + '}\n\n')
 
     value = {'PyLong_FromLong': 'PyLong_FromLong(static_cast<long>(*cell))'}.get(
@@ -341,12 +349,13 @@ def _pointer_class(p: PointerClass) -> str:
            f'  if (!swigrt::UnpackTuple(args, {c_string(p.entry("new"))}, 0, 0, argv)) '
            'return nullptr;\n'
            f'  return swigrt::NewPointerObj(nullptr, new {t}(), {own}, SWIG_POINTER_NEW);\n}}\n\n',
-           f'PyObject *wrap_{p.entry("delete")}(PyObject *, PyObject *arg) {{\n'
+           _open(f'wrap_{p.entry("delete")}', 'arg') +
            '  if (!arg) return nullptr;\n  void *argp1 = nullptr;\n'
            f'  if (!swigrt::PointerArg(arg, {own}, SWIG_POINTER_DISOWN, &argp1, '
            f'{c_string(delete_msg)})) return nullptr;\n'
-           f'  delete static_cast<{t} *>(argp1);\n  Py_RETURN_NONE;\n}}\n\n',
-           f'PyObject *wrap_{p.entry("assign")}(PyObject *, PyObject *args) {{\n'
+           f'  delete static_cast<{t} *>(argp1);\n'
+           '  swigrt::ForgetPointer(arg, argp1);\n  Py_RETURN_NONE;\n}\n\n',
+           _open(f'wrap_{p.entry("assign")}', 'args') +
            '  PyObject *argv[2] = {};\n'
            f'  if (!swigrt::UnpackTuple(args, {c_string(p.entry("assign"))}, 2, 2, argv)) '
            'return nullptr;\n' + self_arg(p.entry('assign')) +

@@ -13,6 +13,7 @@ SwigDirector_Node::SwigDirector_Node(PyObject *self)
 
 SwigDirector_Node::~SwigDirector_Node() {
   TpythonLock lock;
+  swig_forget_object(static_cast<Node *>(this));
 }
 
 // SwigDirector_Shape
@@ -24,6 +25,7 @@ SwigDirector_Shape::SwigDirector_Shape(PyObject *self)
 
 SwigDirector_Shape::~SwigDirector_Shape() {
   TpythonLock lock;
+  swig_forget_object(static_cast<Shape *>(this));
 }
 
 // SwigDirector_Abstract
@@ -35,10 +37,12 @@ SwigDirector_Abstract::SwigDirector_Abstract(PyObject *self)
 
 SwigDirector_Abstract::~SwigDirector_Abstract() {
   TpythonLock lock;
+  swig_forget_object(static_cast<Abstract *>(this));
 }
 
 Value SwigDirector_Abstract::name() const {
   TpythonLock py_lock;
+  swigrt::CallScope py_scope;
   if (!swig_get_self()) swigrt::RaiseUninitialized("'self' uninitialized, maybe you forgot to call Abstract.__init__.");
   swigrt::Ref py_result(swigrt::CallOverride(this, "name", nullptr, 0));
   return swigrt::ValueResult<Value>(py_result.get(), SWIGTYPE_p_Value, "in output value of type 'Value'");
@@ -53,6 +57,7 @@ SwigDirector_Hidden::SwigDirector_Hidden(PyObject *self)
 
 SwigDirector_Hidden::~SwigDirector_Hidden() {
   TpythonLock lock;
+  swig_forget_object(static_cast<Hidden *>(this));
 }
 
 // SwigDirector_Pair
@@ -74,6 +79,7 @@ SwigDirector_Pair::SwigDirector_Pair(PyObject *self, Node * arg2, Value & arg3, 
 
 SwigDirector_Pair::~SwigDirector_Pair() {
   TpythonLock lock;
+  swig_forget_object(static_cast<Pair *>(this));
 }
 
 }  // namespace Fixture_wrap

@@ -13,6 +13,7 @@ SwigDirector_Mesh::SwigDirector_Mesh(PyObject *self)
 
 SwigDirector_Mesh::~SwigDirector_Mesh() {
   TpythonLock lock;
+  swig_forget_object(static_cast<Mesh *>(this));
 }
 
 }  // namespace Fixture_wrap

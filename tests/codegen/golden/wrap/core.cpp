@@ -7,6 +7,7 @@ namespace Fixture_wrap {
 // Node
 
 PyObject *wrap_new_Node(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   Node *object = argv[0] != Py_None ? new SwigDirector_Node(argv[0]) : new Node();
@@ -15,14 +16,18 @@ PyObject *wrap_new_Node(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_delete_Node(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Node, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Node', argument 1 of type 'Node *'")) return nullptr;
   delete static_cast<Node *>(argp1);
+  // The object is gone: a later use through this wrapper is refused.
+  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
 PyObject *wrap_Node_count(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
@@ -33,6 +38,7 @@ PyObject *wrap_Node_count(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_Node_setCount(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[3] = {};
   if (!swigrt::UnpackTuple(args, "Node_setCount", 2, 3, argv)) return nullptr;
   void *argp1 = nullptr;
@@ -47,6 +53,7 @@ PyObject *wrap_Node_setCount(PyObject *, PyObject *args) {
 }
 
 PyObject *wrap_Node_make(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Node_make", 1, 2, argv)) return nullptr;
   swigrt::CharsArg arg1;
@@ -59,6 +66,7 @@ PyObject *wrap_Node_make(PyObject *, PyObject *args) {
 }
 
 PyObject *wrap_Node_parent(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
@@ -69,6 +77,7 @@ PyObject *wrap_Node_parent(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_Node_value(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
@@ -79,6 +88,7 @@ PyObject *wrap_Node_value(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_Node_rename(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[3] = {};
   if (!swigrt::UnpackTuple(args, "Node_rename", 3, 3, argv)) return nullptr;
   void *argp1 = nullptr;
@@ -99,6 +109,7 @@ PyObject *wrap_Node_rename(PyObject *, PyObject *args) {
 }
 
 PyObject *wrap_Node_names(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Node_names", 1, 2, argv)) return nullptr;
   void *argp1 = nullptr;
@@ -141,6 +152,7 @@ static PyObject *wrap_Node_pick_2(Py_ssize_t argc, PyObject **argv) {
 }
 
 PyObject *wrap_Node_pick(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[3] = {};
   Py_ssize_t argc = swigrt::UnpackTuple(args, "Node_pick", 0, 3, argv) - 1;
   PyObject *result = nullptr;
@@ -155,6 +167,7 @@ PyObject *wrap_Node_pick(PyObject *, PyObject *args) {
 }
 
 PyObject *wrap_disown_Node(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Node, 0, &argp1, "in method 'disown_Node', argument 1 of type 'Node *'")) return nullptr;
@@ -172,6 +185,7 @@ PyObject *wrap_Node_swigregister(PyObject *, PyObject *args) {
 // Shape
 
 PyObject *wrap_new_Shape(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   Shape *object = argv[0] != Py_None ? new SwigDirector_Shape(argv[0]) : new Shape();
@@ -180,14 +194,18 @@ PyObject *wrap_new_Shape(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_delete_Shape(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Shape, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Shape', argument 1 of type 'Shape *'")) return nullptr;
   delete static_cast<Shape *>(argp1);
+  // The object is gone: a later use through this wrapper is refused.
+  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
 PyObject *wrap_disown_Shape(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Shape, 0, &argp1, "in method 'disown_Shape', argument 1 of type 'Shape *'")) return nullptr;
@@ -205,6 +223,7 @@ PyObject *wrap_Shape_swigregister(PyObject *, PyObject *args) {
 // Abstract
 
 PyObject *wrap_new_Abstract(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   if (argv[0] == Py_None) {
@@ -217,20 +236,23 @@ PyObject *wrap_new_Abstract(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_delete_Abstract(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Abstract, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Abstract', argument 1 of type 'Abstract *'")) return nullptr;
   delete static_cast<Abstract *>(argp1);
+  // The object is gone: a later use through this wrapper is refused.
+  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
 PyObject *wrap_Abstract_name(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Abstract, &argp1, "in method 'Abstract_name', argument 1 of type 'Abstract const *'", "invalid null reference in method 'Abstract_name', argument 1 of type 'Abstract const *'")) return nullptr;
-  auto *director = swigrt::ExactProxy(argv[0], SWIGTYPE_p_Abstract) ? nullptr
-                   : dynamic_cast<Swig::Director *>(static_cast<Abstract *>(argp1));
+  Swig::Director *director = Swig::DirectorOf(static_cast<Abstract *>(argp1));
   const bool upcall = director && director->swig_get_self() == argv[0];
   PyObject *resultobj = nullptr;
   try {
@@ -244,6 +266,7 @@ PyObject *wrap_Abstract_name(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_disown_Abstract(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Abstract, 0, &argp1, "in method 'disown_Abstract', argument 1 of type 'Abstract *'")) return nullptr;
@@ -261,6 +284,7 @@ PyObject *wrap_Abstract_swigregister(PyObject *, PyObject *args) {
 // Hidden
 
 PyObject *wrap_new_Hidden(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   if (argv[0] == Py_None) {
@@ -273,14 +297,18 @@ PyObject *wrap_new_Hidden(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_delete_Hidden(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Hidden, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Hidden', argument 1 of type 'Hidden *'")) return nullptr;
   delete static_cast<Hidden *>(argp1);
+  // The object is gone: a later use through this wrapper is refused.
+  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
 PyObject *wrap_disown_Hidden(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Hidden, 0, &argp1, "in method 'disown_Hidden', argument 1 of type 'Hidden *'")) return nullptr;
@@ -331,6 +359,7 @@ static PyObject *wrap_new_Pair_3(Py_ssize_t argc, PyObject **argv) {
 }
 
 PyObject *wrap_new_Pair(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[4] = {};
   Py_ssize_t argc = swigrt::UnpackTuple(args, "new_Pair", 0, 4, argv) - 1;
   PyObject *result = nullptr;
@@ -347,14 +376,18 @@ PyObject *wrap_new_Pair(PyObject *, PyObject *args) {
 }
 
 PyObject *wrap_delete_Pair(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pair, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Pair', argument 1 of type 'Pair *'")) return nullptr;
   delete static_cast<Pair *>(argp1);
+  // The object is gone: a later use through this wrapper is refused.
+  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
 PyObject *wrap_disown_Pair(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pair, 0, &argp1, "in method 'disown_Pair', argument 1 of type 'Pair *'")) return nullptr;
@@ -386,6 +419,7 @@ static PyObject *wrap_new_Value_2(Py_ssize_t argc, PyObject **argv) {
 }
 
 PyObject *wrap_new_Value(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[1] = {};
   Py_ssize_t argc = swigrt::UnpackTuple(args, "new_Value", 0, 1, argv) - 1;
   PyObject *result = nullptr;
@@ -400,10 +434,13 @@ PyObject *wrap_new_Value(PyObject *, PyObject *args) {
 }
 
 PyObject *wrap_delete_Value(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Value, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Value', argument 1 of type 'Value *'")) return nullptr;
   delete static_cast<Value *>(argp1);
+  // The object is gone: a later use through this wrapper is refused.
+  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
@@ -414,19 +451,24 @@ PyObject *wrap_Value_swigregister(PyObject *, PyObject *args) {
 // Pod
 
 PyObject *wrap_new_Pod(PyObject *, PyObject *) {
+  swigrt::CallScope scope;
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pod(), SWIGTYPE_p_Pod, SWIG_POINTER_NEW);
   return resultobj;
 }
 
 PyObject *wrap_delete_Pod(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pod, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Pod', argument 1 of type 'Pod *'")) return nullptr;
   delete static_cast<Pod *>(argp1);
+  // The object is gone: a later use through this wrapper is refused.
+  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
 PyObject *wrap_Pod_count_set(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Pod_count_set", 2, 2, argv)) return nullptr;
   void *argp1 = nullptr;
@@ -439,6 +481,7 @@ PyObject *wrap_Pod_count_set(PyObject *, PyObject *args) {
 }
 
 PyObject *wrap_Pod_count_get(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
@@ -449,6 +492,7 @@ PyObject *wrap_Pod_count_get(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_Pod_value_set(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Pod_value_set", 2, 2, argv)) return nullptr;
   void *argp1 = nullptr;
@@ -461,6 +505,7 @@ PyObject *wrap_Pod_value_set(PyObject *, PyObject *args) {
 }
 
 PyObject *wrap_Pod_value_get(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
@@ -471,6 +516,7 @@ PyObject *wrap_Pod_value_get(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_Pod_owner_set(PyObject *, PyObject *args) {
+  swigrt::CallScope scope;
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Pod_owner_set", 2, 2, argv)) return nullptr;
   void *argp1 = nullptr;
@@ -483,6 +529,7 @@ PyObject *wrap_Pod_owner_set(PyObject *, PyObject *args) {
 }
 
 PyObject *wrap_Pod_owner_get(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;

@@ -7,6 +7,7 @@ namespace Fixture_wrap {
 // Mesh
 
 PyObject *wrap_new_Mesh(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   Mesh *object = argv[0] != Py_None ? new SwigDirector_Mesh(argv[0]) : new Mesh();
@@ -15,14 +16,18 @@ PyObject *wrap_new_Mesh(PyObject *, PyObject *arg) {
 }
 
 PyObject *wrap_delete_Mesh(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Mesh, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Mesh', argument 1 of type 'Mesh *'")) return nullptr;
   delete static_cast<Mesh *>(argp1);
+  // The object is gone: a later use through this wrapper is refused.
+  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
 PyObject *wrap_disown_Mesh(PyObject *, PyObject *arg) {
+  swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Mesh, 0, &argp1, "in method 'disown_Mesh', argument 1 of type 'Mesh *'")) return nullptr;
