@@ -38,3 +38,21 @@ PyObject *ErrorTypeFor(int code) {
 void SetErrorMessage(PyObject *errtype, const char *message) { PyErr_SetString(errtype, message); }
 
 }  // namespace swigrt
+
+namespace swigrt {
+
+void SetErrorFromException() noexcept {
+  try {
+    throw;
+  } catch (const std::bad_alloc &) {
+    PyErr_NoMemory();
+  } catch (const std::length_error &e) {
+    PyErr_SetString(PyExc_MemoryError, e.what());
+  } catch (const std::exception &e) {
+    if (!PyErr_Occurred()) PyErr_SetString(PyExc_RuntimeError, e.what());
+  } catch (...) {
+    if (!PyErr_Occurred()) PyErr_SetString(PyExc_RuntimeError, "unknown C++ exception");
+  }
+}
+
+}  // namespace swigrt

@@ -4,7 +4,27 @@
 #define PY_SSIZE_T_CLEAN
 #include <Python.h>
 
+#include <exception>
+#include <new>
+#include <stdexcept>
+
 namespace swigrt {
+
+// Every entry point is reached through this: a C++ exception that the host
+// (or the module) throws ends the call with a Python exception instead of
+// unwinding into the interpreter. A director exception has set its Python
+// error already and keeps it.
+void SetErrorFromException() noexcept;
+
+template <PyCFunction entry>
+PyObject *Safe(PyObject *self, PyObject *args) noexcept {
+  try {
+    return entry(self, args);
+  } catch (...) {
+    SetErrorFromException();
+    return nullptr;
+  }
+}
 
 PyObject *ErrorTypeFor(int code);  // borrowed exception class
 void SetErrorMessage(PyObject *errtype, const char *message);

@@ -15,11 +15,14 @@
 
 namespace swigrt {
 
+// An error pending after the conversion fails it, whoever set it: also one
+// that a string argument of the same call left (its TypeError then becomes
+// this argument's OverflowError).
 inline int AsLong32(PyObject *obj, long *out) {
   if (!PyLong_Check(obj)) return SWIG_TypeError;
   int overflow = 0;
   long v = PyLong_AsLongAndOverflow(obj, &overflow);
-  if (overflow || (v == -1 && PyErr_Occurred()) || v < INT_MIN || v > INT_MAX) {
+  if (overflow || PyErr_Occurred() || v < INT_MIN || v > INT_MAX) {
     PyErr_Clear();
     return SWIG_OverflowError;
   }
@@ -30,7 +33,7 @@ inline int AsLong32(PyObject *obj, long *out) {
 inline int AsUnsignedLong32(PyObject *obj, unsigned long *out) {
   if (!PyLong_Check(obj)) return SWIG_TypeError;
   unsigned long v = PyLong_AsUnsignedLong(obj);
-  if ((v == static_cast<unsigned long>(-1) && PyErr_Occurred()) || v > UINT_MAX) {
+  if (PyErr_Occurred() || v > UINT_MAX) {
     PyErr_Clear();
     return SWIG_OverflowError;
   }
@@ -39,21 +42,21 @@ inline int AsUnsignedLong32(PyObject *obj, unsigned long *out) {
 }
 
 inline int AsInt(PyObject *obj, int *out) {
-  long v;
+  long v = 0;
   int res = AsLong32(obj, &v);
   if (SWIG_IsOK(res) && out) *out = static_cast<int>(v);
   return res;
 }
 
 inline int AsUnsignedInt(PyObject *obj, unsigned int *out) {
-  unsigned long v;
+  unsigned long v = 0;
   int res = AsUnsignedLong32(obj, &v);
   if (SWIG_IsOK(res) && out) *out = static_cast<unsigned int>(v);
   return res;
 }
 
 inline int AsShort(PyObject *obj, short *out) {
-  long v;
+  long v = 0;
   int res = AsLong32(obj, &v);
   if (!SWIG_IsOK(res)) return res;
   if (static_cast<unsigned long>(v + 32768) > 65535) return SWIG_OverflowError;
@@ -62,7 +65,7 @@ inline int AsShort(PyObject *obj, short *out) {
 }
 
 inline int AsUnsignedChar(PyObject *obj, unsigned char *out) {
-  unsigned long v;
+  unsigned long v = 0;
   int res = AsUnsignedLong32(obj, &v);
   if (!SWIG_IsOK(res)) return res;
   if (v > 255) return SWIG_OverflowError;
@@ -83,7 +86,7 @@ inline int AsChar(PyObject *obj, char *out) {
     if (out) *out = len ? bytes[0] : 0;
     return SWIG_OK;
   }
-  long v;
+  long v = 0;
   int res = AsLong32(obj, &v);
   if (!SWIG_IsOK(res)) return res;
   if (v < -128 || v > 127) return SWIG_OverflowError;
@@ -100,7 +103,7 @@ inline int AsBool(PyObject *obj, bool *out) {
 }
 
 inline int AsDouble(PyObject *obj, double *out) {
-  double v;
+  double v = 0;
   if (PyFloat_Check(obj)) {
     v = PyFloat_AsDouble(obj);
   } else if (PyLong_Check(obj)) {
@@ -117,7 +120,7 @@ inline int AsDouble(PyObject *obj, double *out) {
 }
 
 inline int AsFloat(PyObject *obj, float *out) {
-  double v;
+  double v = 0;
   int res = AsDouble(obj, &v);
   if (!SWIG_IsOK(res)) return res;
   // Infinities and NaN pass and narrow as they are.

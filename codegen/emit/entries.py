@@ -73,7 +73,7 @@ def _value(a: Arg) -> str:
     n = a.number
     return {
         'scalar': lambda: f'static_cast<{a.cast}>(arg{n})' if a.cast else f'arg{n}',
-        'object': lambda: (f'*static_cast<{a.cpp}>(argp{n})' if a.reference
+        'object': lambda: (f'*static_cast<{a.cpp}>(argp{n})' if a.reference and not a.array
                            else f'static_cast<{a.cpp}>(argp{n})'),
         'string': lambda: f'arg{n}',
         'string_array': lambda: f'arg{n}',

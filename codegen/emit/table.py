@@ -7,8 +7,13 @@ from ..model import Module, METH_NOARGS, METH_O, METH_VARARGS
 _FLAGS = {METH_VARARGS: 'METH_VARARGS', METH_NOARGS: 'METH_NOARGS', METH_O: 'METH_O'}
 
 
+def _guarded(function: str) -> str:
+    return function if function.startswith('swigrt::') else f'swigrt::Safe<{function}>'
+
+
 def emit(module: Module) -> str:
-    rows = ''.join(f'    {{{c_string(e.name)}, {e.function}, {_FLAGS[e.flags]}, nullptr}},\n'
+    # Every generated or hand-written entry point runs inside swigrt::Safe.
+    rows = ''.join(f'    {{{c_string(e.name)}, {_guarded(e.function)}, {_FLAGS[e.flags]}, nullptr}},\n'
                    for e in module.entries)
     end = '    {nullptr, nullptr, 0, nullptr},\n'
     return ''.join([

@@ -63,8 +63,10 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
     """How parameter `p`, argument `number` of `entry`, is filled."""
     t = p.type
     declared = spell(t)
-    if t.kind == 'array':
-        # An array parameter is a pointer to its first element.
+    # An array parameter is a pointer to its first element, which the host
+    # reads: a null one is refused as a null reference is.
+    array = t.kind == 'array'
+    if array:
         t = CType('pointer', inner=t.inner)
     inner = t.inner if t.kind in ('pointer', 'lvref') else None
     method = f"in method '{entry}', argument {number} of type "
@@ -152,14 +154,14 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
             target.kind == 'builtin' and target.name == 'void':
         raise unsupported()
     s = declared
-    ref = t.kind != 'pointer'
+    ref = t.kind != 'pointer' or array
     default = None if ref else null_default()
     if ref and p.default is not None:
         raise unsupported()
     return Arg(number, slot, s, 'object', spell(CType('pointer', inner=target)), method + f"'{s}'",
                descriptor=descriptor_for(target), reference=ref,
                null_message=f"invalid null reference {method}'{s}'" if ref else None,
-               default=default)
+               default=default, array=array)
 
 
 def self_argument(cls: str, entry: str, const: bool, descriptor: Descriptor) -> Arg:

@@ -56,6 +56,8 @@ class Arg:
     is_self: bool = False        # `self` of a member call
     announce: str = ''           # callable: the host function announcing it
     disown: bool = False         # object: the wrapper gives its object up to the host
+    array: bool = False          # object: an array, passed as the pointer to its first
+                                 # element, null refused like a reference
 
     @property
     def optional(self) -> bool:

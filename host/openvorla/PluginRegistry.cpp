@@ -346,11 +346,11 @@ unsigned int matrixTypeId(const VObject &plugin, unsigned int transformTypeId) {
 
 namespace {
 
-// An instance made by the callback; null if it made none.
-void *make(const Registration &r, const Callback &creator) {
+// An instance made by the callback as a `base`; null if it made none.
+void *make(const Registration &r, const Callback &creator, const char *base) {
   if (!creator.script) return reinterpret_cast<VCreatorFunction>(creator.function)();
   if (const standin::ScriptCallableHooks *hooks = gHooks.load())
-    return hooks->create(creator.script);
+    return hooks->create(creator.script, base);
   Tlog::write(std::string("No scripting engine to run the creator of ") + describe(r).asUTF8());
   return nullptr;
 }
@@ -402,7 +402,7 @@ std::vector<RegistrationInfo> registrations() {
 VPxNode *createNode(const VString &typeName) {
   RegistrationPtr r = findNamed(typeName, isNodeKind);
   if (!r) return nullptr;
-  auto *node = static_cast<VPxNode *>(make(*r, *r->find(CallbackRole::kCreator)));
+  auto *node = static_cast<VPxNode *>(make(*r, *r->find(CallbackRole::kCreator), "VPxNode"));
   if (!node) return nullptr;
   VFn::Type type = r->kind == RegistrationKind::kTransform ? VFn::kTransform
                    : r->kind == RegistrationKind::kShape   ? VFn::kDagNode
@@ -461,28 +461,29 @@ VPxCommand *createCommand(const VString &commandName) {
     });
     role = CallbackRole::kToolCommandCreator;
   }
-  return r ? static_cast<VPxCommand *>(make(*r, *r->find(role))) : nullptr;
+  return r ? static_cast<VPxCommand *>(make(*r, *r->find(role), "VPxCommand")) : nullptr;
 }
 
 VPxData *createData(const VTypeId &typeId) {
   RegistrationPtr r = theRegistry().find([&](const Registration &e) {
     return e.kind == RegistrationKind::kData && e.typeId == typeId.id();
   });
-  return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator))) : nullptr;
+  return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator), "VPxData")) : nullptr;
 }
 
 VPxData *createData(const VString &typeName) {
   RegistrationPtr r = findNamed(typeName, [](RegistrationKind k) {
     return k == RegistrationKind::kData;
   });
-  return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator))) : nullptr;
+  return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator), "VPxData")) : nullptr;
 }
 
 VPxFileTranslator *createTranslator(const VString &translatorName) {
   RegistrationPtr r = findNamed(translatorName, [](RegistrationKind k) {
     return k == RegistrationKind::kFileTranslator;
   });
-  return r ? static_cast<VPxFileTranslator *>(make(*r, *r->find(CallbackRole::kCreator)))
+  return r ? static_cast<VPxFileTranslator *>(
+                 make(*r, *r->find(CallbackRole::kCreator), "VPxFileTranslator"))
            : nullptr;
 }
 

@@ -24,15 +24,45 @@ class PendingError {
   PyObject *fType, *fValue, *fTraceback;
 };
 
+// Whether `instance` is of the plug-in class `base`, as the package that
+// plug-ins import defines it: 1 if it is, 0 with TypeError set if it is not,
+// -1 when the package is not loaded and cannot tell.
+int isOfBase(PyObject *instance, const char *base) {
+  PyObject *name = PyUnicode_FromString("openvorla.OpenVorlaVPx");
+  PyObject *module = name ? PyImport_GetModule(name) : nullptr;
+  Py_XDECREF(name);
+  PyObject *cls = module ? PyObject_GetAttrString(module, base) : nullptr;
+  Py_XDECREF(module);
+  if (!cls) {
+    PyErr_Clear();
+    return -1;
+  }
+  int is = PyObject_IsInstance(instance, cls);
+  Py_DECREF(cls);
+  if (is == 0)
+    PyErr_Format(PyExc_TypeError,
+                 "a %s creator must return an instance of %s or of a class derived from it, "
+                 "not '%.200s'",
+                 base, base, Py_TYPE(instance)->tp_name);
+  return is;
+}
+
 // The C++ address of a proxy instance: its "this" converts to the address.
-void *addressOf(PyObject *instance) {
+// `derived`: the instance is known to be of a plug-in class.
+void *addressOf(PyObject *instance, bool derived) {
   PyObject *self = PyObject_GetAttrString(instance, "this");
   if (!self) {
     if (PyErr_ExceptionMatches(PyExc_AttributeError)) {
       PyErr_Clear();
-      PyErr_Format(PyExc_TypeError,
-                   "a creator must return an instance of a plug-in class, not '%.200s'",
-                   Py_TYPE(instance)->tp_name);
+      if (derived)
+        PyErr_Format(PyExc_TypeError,
+                     "the '%.200s' instance a creator returned has no C++ object: its "
+                     "__init__ must call its base class's __init__",
+                     Py_TYPE(instance)->tp_name);
+      else
+        PyErr_Format(PyExc_TypeError,
+                     "a creator must return an instance of a plug-in class, not '%.200s'",
+                     Py_TYPE(instance)->tp_name);
     }
     return nullptr;
   }
@@ -46,14 +76,15 @@ void *addressOf(PyObject *instance) {
   return address;
 }
 
-void *create(PyObject *creator) {
+void *create(PyObject *creator, const char *base) {
   TpythonLock lock;
   PendingError pending;
   void *address = nullptr;
   if (PyObject *instance = PyObject_CallNoArgs(creator)) {
     // The address is read before ownership moves, so that a failure leaves
     // the instance to Python, which frees it, rather than to nobody.
-    address = addressOf(instance);
+    int derived = isOfBase(instance, base);
+    if (derived != 0) address = addressOf(instance, derived == 1);
     if (address) {
       // Hands the C++ object to the host; the instance lives on as long as it.
       PyObject *disowned = PyObject_CallMethod(instance, "__disown__", nullptr);

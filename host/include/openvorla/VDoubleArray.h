@@ -11,7 +11,8 @@ OPENVORLA_NAMESPACE_OPEN
 class OPENVORLA_EXPORT VDoubleArray {
 public:
   VDoubleArray();
-  // length elements, each initialValue.
+  // length elements, each initialValue. More than 2^28 elements
+  // throw std::length_error; setLength() reports kInsufficientMemory.
   VDoubleArray(unsigned int length, double initialValue = 0);
   VDoubleArray(const VDoubleArray &other);
   ~VDoubleArray();

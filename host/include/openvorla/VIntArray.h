@@ -11,7 +11,8 @@ OPENVORLA_NAMESPACE_OPEN
 class OPENVORLA_EXPORT VIntArray {
 public:
   VIntArray();
-  // length elements, each initialValue.
+  // length elements, each initialValue. More than 2^28 elements
+  // throw std::length_error; setLength() reports kInsufficientMemory.
   VIntArray(unsigned int length, int initialValue = 0);
   VIntArray(const VIntArray &other);
   ~VIntArray();

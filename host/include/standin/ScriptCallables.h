@@ -11,8 +11,10 @@ namespace standin {
 
 struct ScriptCallableHooks {
   // Calls the object with no arguments and takes over the instance it
-  // returns; its C++ address, or null with the failure reported.
-  void *(*create)(PyObject *creator);
+  // returns, which must be of the plug-in class named `base` (the proxy
+  // class the host makes the object as: "VPxNode", "VPxCommand", ...); its
+  // C++ address, or null with the failure reported.
+  void *(*create)(PyObject *creator, const char *base);
   // Calls the object with no arguments; false, the failure reported, if it
   // raised.
   bool (*run)(PyObject *callable);
