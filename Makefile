@@ -2,10 +2,12 @@
 # what is missing (Debian packages), configures, builds and runs.
 PYTHON   := /usr/bin/python3
 BUILD    ?= build
+# The same tree built with AddressSanitizer and UndefinedBehaviorSanitizer.
+ASAN_BUILD ?= $(BUILD)-asan
 PACKAGES := cmake ninja-build g++ python3-dev python3-pytest python3-clang-14
 BENCH_PACKAGES := pybind11-dev
 
-.PHONY: all deps build test demo bench clean
+.PHONY: all deps build build-asan test test-plain test-asan demo bench clean
 
 all: build
 
@@ -18,10 +20,33 @@ $(BUILD)/build.ninja:
 build: deps $(BUILD)/build.ninja
 	cmake --build $(BUILD)
 
-test: build
+$(ASAN_BUILD)/build.ninja:
+	cmake -S . -B $(ASAN_BUILD) -G Ninja -DOPENVORLA_SANITIZE=ON
+
+build-asan: deps $(ASAN_BUILD)/build.ninja
+	cmake --build $(ASAN_BUILD)
+
+# Python itself is not instrumented: the sanitizer runtimes are preloaded, the
+# interpreter allocates through malloc so that its objects are checked too,
+# and leaks are not reported (the interpreter keeps much until exit).
+SANITIZED := LD_PRELOAD=$$(gcc -print-file-name=libasan.so):$$(gcc -print-file-name=libubsan.so) \
+	ASAN_OPTIONS=detect_leaks=0:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1 \
+	PYTHONMALLOC=malloc
+
+# Every test on the plain build, then on the sanitizer build with the demo.
+test: test-plain test-asan
+
+test-plain: build
 	cmake --build $(BUILD) --target test-support
 	$(BUILD)/bin/host_selftest
 	OPENVORLA_BUILD=$(BUILD) $(PYTHON) -m pytest -q tests
+
+test-asan: build-asan
+	cmake --build $(ASAN_BUILD) --target test-support
+	ASAN_OPTIONS=detect_leaks=0:abort_on_error=1 $(ASAN_BUILD)/bin/host_selftest
+	$(SANITIZED) OPENVORLA_BUILD=$(ASAN_BUILD) $(PYTHON) -m pytest -q tests
+	ASAN_OPTIONS=detect_leaks=0:abort_on_error=1 $(ASAN_BUILD)/bin/vorla \
+	  $(foreach p,$(EXAMPLES),--plugin examples/plugins/$(p).py) examples/scenes/demo.py >/dev/null
 
 EXAMPLES := sine_node offset_command vector_data text_translator
 
@@ -37,4 +62,4 @@ bench: build
 	$(PYTHON) bench/bench_calls.py --build $(BUILD)
 
 clean:
-	rm -rf $(BUILD)
+	rm -rf $(BUILD) $(ASAN_BUILD)

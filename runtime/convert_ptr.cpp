@@ -157,7 +157,7 @@ int ConvertPtr(PyObject *obj, void **out, swig_type_info *ty, int flags, int *ow
       return SWIG_ERROR_RELEASE_NOT_OWNED;
     if (own) *own |= sobj->own;
     if (flags & SWIG_POINTER_DISOWN) sobj->own = 0;
-    if (flags & SWIG_POINTER_CLEAR) sobj->ptr = nullptr;
+    if (flags & (SWIG_POINTER_CLEAR | SWIG_POINTER_FORGET)) sobj->ptr = nullptr;
     return SWIG_OK;
   }
   if (!(flags & SWIG_POINTER_IMPLICIT_CONV)) return SWIG_ERROR;

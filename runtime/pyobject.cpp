@@ -152,7 +152,9 @@ void Dealloc(PyObject *self) {
   PyObject_Free(self);
   // The rest of the chain, one wrapper at a time: releasing `next` from its
   // own deallocation would recurse once per link.
-  while (next && Py_REFCNT(next) == 1 && Py_TYPE(next) == SwigPyObject_type()) {
+  while (next && Py_TYPE(next) == SwigPyObject_type()) {
+    --AsWrapper(next)->links;
+    if (Py_REFCNT(next) != 1) break;
     PyObject *after = AsWrapper(next)->next;
     AsWrapper(next)->next = nullptr;
     Py_DECREF(next);
@@ -217,6 +219,7 @@ PyObject *SwigPyObject_New(void *ptr, swig_type_info *ty, int own) {
   sobj->own = own;
   sobj->next = nullptr;
   sobj->table = nullptr;
+  sobj->links = 0;
   if (own == SWIG_POINTER_OWN) detail::HoldTable(sobj);
   return reinterpret_cast<PyObject *>(sobj);
 }
@@ -294,6 +297,13 @@ int SetSwigThis(PyObject *inst, PyObject *swig_this) {
 
 namespace detail {
 
+// Keeps `links` right when `next` of `from` gains or loses `to`; only links
+// between wrappers of our own type are counted.
+void CountLink(PyObject *from, PyObject *to, int delta) {
+  PyTypeObject *own = SwigPyObject_type();
+  if (to && Py_TYPE(from) == own && Py_TYPE(to) == own) AsWrapper(to)->links += delta;
+}
+
 void HoldTable(SwigPyObject *sobj) {
   if (sobj->table || Py_TYPE(sobj) != SwigPyObject_type()) return;
   PyObject *capsule = TableCapsule();
@@ -309,8 +319,10 @@ PyObject *AppendThis(PyObject *self, PyObject *obj) {
   }
   SwigPyObject *receiver = AsWrapper(self);
   // A wrapper already in the chain would close it into a ring that
-  // conversion and repr would walk forever.
-  for (PyObject *link = self; link; link = AsWrapper(link)->next) {
+  // conversion and repr would walk forever. The head of a chain of our own
+  // type is in no other chain, which spares the walk in the common case.
+  bool head = Py_TYPE(obj) == SwigPyObject_type() && AsWrapper(obj)->links == 0;
+  for (PyObject *link = self; link && (!head || link == self); link = AsWrapper(link)->next) {
     if (link == obj) {
       PyErr_SetString(PyExc_ValueError, "Attempt to append a SwigPyObject already in the chain");
       return nullptr;
@@ -318,9 +330,14 @@ PyObject *AppendThis(PyObject *self, PyObject *obj) {
   }
   SwigPyObject *added = AsWrapper(obj);
   PyObject *dropped = added->next;
+  PyObject *moved = receiver->next;
   Py_INCREF(obj);
-  added->next = receiver->next;  // the receiver's reference moves over
+  added->next = moved;  // the receiver's reference moves over
   receiver->next = obj;
+  CountLink(self, moved, -1);
+  CountLink(obj, moved, +1);
+  CountLink(obj, dropped, -1);
+  CountLink(self, obj, +1);
   Py_XDECREF(dropped);
   Py_RETURN_NONE;
 }

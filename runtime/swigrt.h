@@ -81,6 +81,9 @@ struct SwigPyObject {
   // destructor named by the table stays reachable while it may be needed.
   // Kept apart from `own` because ownership can change many times.
   PyObject *table;
+  // How many wrappers of this module's type have this one as their `next`;
+  // 0 for the head of a chain, which therefore cannot be inside another.
+  Py_ssize_t links;
 };
 
 // A copied block of bytes with its type.
@@ -110,6 +113,9 @@ enum : int {
   SWIG_POINTER_NO_NULL = 0x4,
   SWIG_POINTER_CLEAR = 0x8,
   SWIG_POINTER_RELEASE = SWIG_POINTER_CLEAR | SWIG_POINTER_DISOWN,
+  // The module's own: the wrapper found stops pointing at the object, which
+  // the caller is about to delete (whether or not the wrapper owned it).
+  SWIG_POINTER_FORGET = 0x10,
 
   SWIG_POINTER_OWN = 0x1,
   SWIG_POINTER_NOSHADOW = 0x2,

@@ -305,11 +305,10 @@ def _class(cls: WrappedClass) -> str:
         out.append(entry_point(cls.name, cls.constructor) + '\n')
     out.append(_open(f'wrap_{cls.delete_entry}', 'arg') +
                '  if (!arg) return nullptr;\n  void *argp1 = nullptr;\n'
-               f'  if (!swigrt::PointerArg(arg, {d}, SWIG_POINTER_DISOWN, &argp1, {msg})) '
-               'return nullptr;\n'
-               f'  delete static_cast<{cls.name} *>(argp1);\n'
-               '  // The object is gone: a later use through this wrapper is refused.\n'
-               '  swigrt::ForgetPointer(arg, argp1);\n  Py_RETURN_NONE;\n}\n\n')
+               '  // The wrapper stops pointing at the object: a later use is refused.\n'
+               f'  if (!swigrt::PointerArg(arg, {d}, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, '
+               f'&argp1, {msg})) return nullptr;\n'
+               f'  delete static_cast<{cls.name} *>(argp1);\n  Py_RETURN_NONE;\n}}\n\n')
     out += [entry_point(cls.name, m) + '\n' for m in cls.members if m.candidates]
     if cls.director:
         msg = c_string(f"in method 'disown_{cls.name}', argument 1 of type '{cls.name} *'")
@@ -351,10 +350,9 @@ def _pointer_class(p: PointerClass) -> str:
            f'  return swigrt::NewPointerObj(nullptr, new {t}(), {own}, SWIG_POINTER_NEW);\n}}\n\n',
            _open(f'wrap_{p.entry("delete")}', 'arg') +
            '  if (!arg) return nullptr;\n  void *argp1 = nullptr;\n'
-           f'  if (!swigrt::PointerArg(arg, {own}, SWIG_POINTER_DISOWN, &argp1, '
-           f'{c_string(delete_msg)})) return nullptr;\n'
-           f'  delete static_cast<{t} *>(argp1);\n'
-           '  swigrt::ForgetPointer(arg, argp1);\n  Py_RETURN_NONE;\n}\n\n',
+           f'  if (!swigrt::PointerArg(arg, {own}, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, '
+           f'&argp1, {c_string(delete_msg)})) return nullptr;\n'
+           f'  delete static_cast<{t} *>(argp1);\n  Py_RETURN_NONE;\n}}\n\n',
            _open(f'wrap_{p.entry("assign")}', 'args') +
            '  PyObject *argv[2] = {};\n'
            f'  if (!swigrt::UnpackTuple(args, {c_string(p.entry("assign"))}, 2, 2, argv)) '

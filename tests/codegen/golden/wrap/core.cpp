@@ -19,10 +19,9 @@ PyObject *wrap_delete_Node(PyObject *, PyObject *arg) {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
-  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Node, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Node', argument 1 of type 'Node *'")) return nullptr;
+  // The wrapper stops pointing at the object: a later use is refused.
+  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Node, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Node', argument 1 of type 'Node *'")) return nullptr;
   delete static_cast<Node *>(argp1);
-  // The object is gone: a later use through this wrapper is refused.
-  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
@@ -197,10 +196,9 @@ PyObject *wrap_delete_Shape(PyObject *, PyObject *arg) {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
-  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Shape, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Shape', argument 1 of type 'Shape *'")) return nullptr;
+  // The wrapper stops pointing at the object: a later use is refused.
+  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Shape, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Shape', argument 1 of type 'Shape *'")) return nullptr;
   delete static_cast<Shape *>(argp1);
-  // The object is gone: a later use through this wrapper is refused.
-  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
@@ -239,10 +237,9 @@ PyObject *wrap_delete_Abstract(PyObject *, PyObject *arg) {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
-  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Abstract, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Abstract', argument 1 of type 'Abstract *'")) return nullptr;
+  // The wrapper stops pointing at the object: a later use is refused.
+  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Abstract, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Abstract', argument 1 of type 'Abstract *'")) return nullptr;
   delete static_cast<Abstract *>(argp1);
-  // The object is gone: a later use through this wrapper is refused.
-  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
@@ -300,10 +297,9 @@ PyObject *wrap_delete_Hidden(PyObject *, PyObject *arg) {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
-  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Hidden, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Hidden', argument 1 of type 'Hidden *'")) return nullptr;
+  // The wrapper stops pointing at the object: a later use is refused.
+  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Hidden, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Hidden', argument 1 of type 'Hidden *'")) return nullptr;
   delete static_cast<Hidden *>(argp1);
-  // The object is gone: a later use through this wrapper is refused.
-  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
@@ -379,10 +375,9 @@ PyObject *wrap_delete_Pair(PyObject *, PyObject *arg) {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
-  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pair, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Pair', argument 1 of type 'Pair *'")) return nullptr;
+  // The wrapper stops pointing at the object: a later use is refused.
+  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pair, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Pair', argument 1 of type 'Pair *'")) return nullptr;
   delete static_cast<Pair *>(argp1);
-  // The object is gone: a later use through this wrapper is refused.
-  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
@@ -437,10 +432,9 @@ PyObject *wrap_delete_Value(PyObject *, PyObject *arg) {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
-  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Value, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Value', argument 1 of type 'Value *'")) return nullptr;
+  // The wrapper stops pointing at the object: a later use is refused.
+  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Value, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Value', argument 1 of type 'Value *'")) return nullptr;
   delete static_cast<Value *>(argp1);
-  // The object is gone: a later use through this wrapper is refused.
-  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
@@ -460,10 +454,9 @@ PyObject *wrap_delete_Pod(PyObject *, PyObject *arg) {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
-  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pod, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Pod', argument 1 of type 'Pod *'")) return nullptr;
+  // The wrapper stops pointing at the object: a later use is refused.
+  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pod, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Pod', argument 1 of type 'Pod *'")) return nullptr;
   delete static_cast<Pod *>(argp1);
-  // The object is gone: a later use through this wrapper is refused.
-  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 

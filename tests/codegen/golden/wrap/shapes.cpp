@@ -19,10 +19,9 @@ PyObject *wrap_delete_Mesh(PyObject *, PyObject *arg) {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
-  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Mesh, SWIG_POINTER_DISOWN, &argp1, "in method 'delete_Mesh', argument 1 of type 'Mesh *'")) return nullptr;
+  // The wrapper stops pointing at the object: a later use is refused.
+  if (!swigrt::PointerArg(arg, SWIGTYPE_p_Mesh, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Mesh', argument 1 of type 'Mesh *'")) return nullptr;
   delete static_cast<Mesh *>(argp1);
-  // The object is gone: a later use through this wrapper is refused.
-  swigrt::ForgetPointer(arg, argp1);
   Py_RETURN_NONE;
 }
 
