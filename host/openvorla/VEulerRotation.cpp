@@ -13,6 +13,9 @@ namespace {
 // The axes of each order, the first applied first.
 const int kAxes[6][3] = {{0, 1, 2}, {1, 2, 0}, {2, 0, 1}, {0, 2, 1}, {1, 0, 2}, {2, 1, 0}};
 
+// An order that names none of the six is taken as kXYZ.
+const int *axesOf(int order) { return kAxes[order >= 0 && order < 6 ? order : 0]; }
+
 const VVector &axisVector(int axis) {
   static const VVector kUnit[3] = {VVector(1, 0, 0), VVector(0, 1, 0), VVector(0, 0, 1)};
   return kUnit[axis];
@@ -39,7 +42,7 @@ VEulerRotation &VEulerRotation::setValue(double xx, double yy, double zz, Rotati
 
 VQuaternion VEulerRotation::asQuaternion() const {
   const double angles[3] = {x, y, z};
-  const int *axes = kAxes[order];
+  const int *axes = axesOf(order);
   VQuaternion q;
   for (int n = 0; n < 3; ++n) q *= VQuaternion(angles[axes[n]], axisVector(axes[n]));
   return q;
@@ -58,7 +61,7 @@ VEulerRotation VEulerRotation::reorder(RotationOrder newOrder) const {
 // tan c = s m[i][j] / m[i][i]. When cos b vanishes only a + c (or a - c) is
 // defined; c is then taken as 0.
 VEulerRotation VEulerRotation::decompose(const VMatrix &m, RotationOrder ord) {
-  const int *axes = kAxes[ord];
+  const int *axes = axesOf(ord);
   const int i = axes[0], j = axes[1], k = axes[2];
   const double s = (j == (i + 1) % 3) ? 1.0 : -1.0;
   const double cosB = std::hypot(m(i, i), m(i, j));

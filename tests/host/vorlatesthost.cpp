@@ -405,6 +405,34 @@ PyObject *string_ids(PyObject *, PyObject *) {
   return Py_BuildValue("(ii)", TstringId::constructedCount(), TstringId::destroyedCount());
 }
 
+// checked_call(fn, args) -> fn(*args), with the check the interpreter makes
+// only on some of its call paths: a result returned with an error still set
+// becomes SystemError "... returned a result with an exception set", the
+// error its cause.
+PyObject *checked_call(PyObject *, PyObject *args) {
+  PyObject *fn, *arguments;
+  if (!PyArg_ParseTuple(args, "OO!", &fn, &PyTuple_Type, &arguments)) return nullptr;
+  PyObject *result = PyObject_Call(fn, arguments, nullptr);
+  if (result && PyErr_Occurred()) {
+    Py_DECREF(result);
+    PyObject *type, *value, *tb;
+    PyErr_Fetch(&type, &value, &tb);
+    PyErr_NormalizeException(&type, &value, &tb);
+    PyErr_Format(PyExc_SystemError, "%R returned a result with an exception set", fn);
+    PyObject *t2, *v2, *tb2;
+    PyErr_Fetch(&t2, &v2, &tb2);
+    PyErr_NormalizeException(&t2, &v2, &tb2);
+    PyException_SetCause(v2, value);  // steals value
+    Py_XDECREF(type);
+    Py_XDECREF(tb);
+    PyErr_Restore(t2, v2, tb2);
+    return nullptr;
+  }
+  if (!result && !PyErr_Occurred())
+    PyErr_Format(PyExc_SystemError, "%R returned NULL without setting an exception", fn);
+  return result;
+}
+
 template <long (*Count)(const char *)>
 PyObject *counter(PyObject *, PyObject *arg) {
   const char *cls = PyUnicode_AsUTF8(arg);
@@ -455,6 +483,7 @@ PyMethodDef methods[] = {
     {"export_scene", export_scene, METH_VARARGS, "Writes a scene through a translator."},
     {"import_scene", import_scene, METH_VARARGS, "Reads a scene through a translator."},
     {"round_trip_data", round_trip_data, METH_VARARGS, "Reads, copies, writes a data type."},
+    {"checked_call", checked_call, METH_VARARGS, "fn(*args), a result with an error refused."},
     {"string_ids", string_ids, METH_NOARGS, "Resource identifiers made and destroyed."},
     {"alive", counter<standin::aliveCount>, METH_O, "Host objects of a class alive now."},
     {"constructed", counter<standin::constructedCount>, METH_O, "Host objects constructed."},
