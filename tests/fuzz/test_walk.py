@@ -14,17 +14,19 @@ def test_the_hostile_walk_ends_cleanly_in_every_shard():
     env = dict(os.environ, PYTHONPATH=os.pathsep.join(sys.path))
     children = [subprocess.Popen([sys.executable, os.path.join(HERE, 'walk.py'), str(k),
                                   str(SHARDS)], env=env, cwd=HERE, stdout=subprocess.PIPE,
-                                 stderr=subprocess.DEVNULL, text=True)
+                                 stderr=subprocess.PIPE, text=True)
                 for k in range(SHARDS)]
     for child in children:
         try:
-            out, _ = child.communicate(timeout=1200)
+            out, err = child.communicate(timeout=1200)
         except subprocess.TimeoutExpired:
             child.kill()
-            out, _ = child.communicate()
+            out, err = child.communicate()
             raise AssertionError(f'hung after {out.splitlines()[-1:]}')
         lines = out.splitlines()
-        assert child.returncode == 0, f'status {child.returncode} after {lines[-1:]}'
+        # The stderr tail carries a sanitizer's report, if any.
+        report = '\n'.join(err.splitlines()[-40:])
+        assert child.returncode == 0, f'status {child.returncode} after {lines[-1:]}\n{report}'
         assert lines[-1].startswith('done'), lines[-3:]
         problems = [line for line in lines if line.startswith('PROBLEM')]
         assert not problems, '\n'.join(problems[:50])
