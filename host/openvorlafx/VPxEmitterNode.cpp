@@ -79,11 +79,12 @@ void VPxEmitterNode::resetRandomState(int plugIndex, VDataBlock &block) {
 }
 
 void VPxEmitterNode::getRandomState(int, VDataBlock &block) {
-  fRandomState = static_cast<unsigned int>(block.inputValue(mRandStateX).asInt());
+  fRandomState = static_cast<unsigned int>(block.inputValue(mRandStateX).asDouble());
 }
 
 void VPxEmitterNode::setRandomState(int, VDataBlock &block) {
-  block.outputValue(mRandStateX).setInt(static_cast<int>(fRandomState & 0x7fffffffu));
+  // A double holds every 32-bit state exactly; an int would not.
+  block.outputValue(mRandStateX).setDouble(fRandomState);
 }
 
 // A linear congruential generator: the same seed gives the same numbers.
