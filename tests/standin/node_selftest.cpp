@@ -15,14 +15,17 @@
 #include <openvorla/VPxHardwareShader.h>
 #include <openvorla/VPxHwShaderNode.h>
 #include <openvorla/VPxIkSolverNode.h>
+#include <openvorla/VPxImagePlane.h>
 #include <openvorla/VPxLocatorNode.h>
 #include <openvorla/VPxManipContainer.h>
 #include <openvorla/VPxManipulatorNode.h>
 #include <openvorla/VPxMotionPathNode.h>
+#include <openvorla/VPxObjectSet.h>
 #include <openvorla/VPxParticleAttributeMapperNode.h>
 #include <openvorla/VPxPolyTrg.h>
 #include <openvorla/VPxSpringNode.h>
 #include <openvorla/VPxSurfaceShape.h>
+#include <openvorla/VStringArray.h>
 
 #include <standin/Objects.h>
 
@@ -259,6 +262,89 @@ void testDynamicsAndShaders() {
         VPxHardwareShader::getHardwareShaderPtr(object) == nullptr);
 }
 
+// Every new default, called as a host would with default-constructed values
+// and null pointers: none may crash, and each answers "not handled".
+void testDefaultsTakeEmptyArguments() {
+  VDataBlock block;
+  VObject object;
+  VObjectArray objects;
+  VPlug plug;
+  VMatrix matrix;
+  VSelectionList list;
+  VDagPath path;
+  VStringArray names;
+
+  VPxSurfaceShape shape;
+  VDoubleArray undo;
+  VVectorArray directions;
+  CHECK(!shape.deleteComponents(objects, undo) && !shape.undeleteComponents(objects, undo));
+  CHECK(!shape.vertexOffsetDirection(object, directions) && !shape.convertToTweakNodePlug(plug));
+  shape.componentToPlugs(object, list);
+  shape.transformUsing(matrix, objects, VPxSurfaceShape::kRestorePoints, nullptr);
+  CHECK(shape.newControlPointComponent().isNull() && shape.createFullRenderGroup().isNull());
+  CHECK(!shape.excludeAsPluginShape() && !shape.canMakeLive() && list.isEmpty());
+
+  VPxImagePlane plane;
+  CHECK(plane.exactImageFile() == "" && plane.setImageDirty() && plane.refreshImage());
+  VPxObjectSet set;
+  CHECK(set.canBeDeleted(false) && set.type() == VPxNode::kObjectSet);
+
+  VPxGeometryFilter filter;
+  CHECK(filter.setModifiedCallback(list, true) && filter.getInputGeom(block, 3).isNull());
+
+  Solver solver;
+  CHECK(solver.preSolve() && !solver.groupHandlesByTopology());
+  CHECK(!solver.isAttributeCreatedBySolver(object));
+  solver.snapHandle(object);
+  solver.setHandleGroup(nullptr);
+  CHECK(solver.setCurrentHandle(object) && solver.currentHandle().isNull());
+
+  Constraint constraint;
+  CHECK(constraint.targetAttribute().isNull() &&
+        constraint.constraintRotateOrderAttribute().isNull());
+
+  VPxLocatorNode locator;
+  CHECK(!locator.isBounded() && locator.boundingBox().isEmpty() && !locator.isSelected(path));
+  CHECK(locator.closestPoint(VPoint(), VVector()) == VPoint() && !locator.drawLast());
+
+  VPxManipContainer container;
+  CHECK(container.createChildren() && container.connectToDependNode(object));
+  CHECK(container.doPress() == VStatus::kUnknownParameter &&
+        !container.isManipActive(VFn::kBase, object));
+  CHECK(container.manipToPlugConversion(3).asDouble() == 0);
+
+  VPxManipulatorNode manip;
+  CHECK(manip.connectToDependNode(object) && manip.addDependentPlug(plug).error());
+  CHECK(manip.dependentPlugsReset() && !manip.shouldDraw(path) &&
+        manip.getInstancePtr() == nullptr);
+
+  VPxHwShaderNode shader;
+  CHECK(shader.bind(path) == VStatus::kNotImplemented && shader.glUnbind(path).error());
+  CHECK(shader.glGeometry(path, 0, 0, 0, nullptr, 0, nullptr, nullptr, 0, nullptr, 0, nullptr, 0,
+                          nullptr) == VStatus::kNotImplemented);
+  CHECK(shader.getColorSetNames(names) == 0 && shader.getTexCoordSetNames(names) == 0);
+  CHECK(!shader.hasTransparency() && shader.transparencyOptions() == 0 && names.length() == 0);
+
+  VPxHardwareShader hardware;
+  CHECK(hardware.getAvailableImages("map1", names) == VStatus::kNotImplemented);
+  CHECK(hardware.findResource("a.png", "") == "" && hardware.transparencyOptions() == 0);
+
+  VPxEmitterNode emitter;
+  VVectorArray positions(2, VVector(1, 1, 1));
+  CHECK(emitter.getOwnerPositions(block, positions) && positions.length() == 0);
+  CHECK(emitter.getOwnerShape().isNull() && emitter.getRate(block) == 0);
+
+  VPxFieldNode field;
+  VVectorArray force;
+  CHECK(field.getForceAtPoint(VPointArray(), VVectorArray(), VDoubleArray(), force, 0.04) ==
+        VStatus::kNotImplemented);
+  CHECK(!field.drawIcon() && !field.isFalloffCurveConstantOne());
+
+  VPxFluidEmitterNode fluid;
+  CHECK(fluid.fluidEmitter(object, matrix, 0) == VStatus::kNotImplemented);
+  CHECK(!fluid.hasEmissionFunction(block) && fluid.turbulence(block) == 0);
+}
+
 }  // namespace
 
 void testNodeClasses() {
@@ -267,4 +353,5 @@ void testNodeClasses() {
   testSolversAndConstraints();
   testManipulators();
   testDynamicsAndShaders();
+  testDefaultsTakeEmptyArguments();
 }
