@@ -3,6 +3,7 @@ overloads that pick by argument type, output arguments through the pointer
 classes, and members kept from ordinary Python code."""
 import pytest
 
+import vorlatesthost as host
 from openvorla import OpenVorla as ov, OpenVorlaVPx as vpx, _OpenVorlaVPx as m
 
 NODE_CLASSES = """VPxSurfaceShape VPxComponentShape VPxCameraSet VPxImagePlane VPxObjectSet
@@ -74,3 +75,36 @@ def test_protected_constraint_queries_are_kept_from_plain_calls():
     with pytest.raises(RuntimeError) as e:
         Constraint().passiveOutputAttribute()
     assert str(e.value) == 'accessing protected member passiveOutputAttribute'
+
+
+class TestForwarding:
+    def test_the_solver_name_reaches_the_host_as_text(self):
+        class Named(vpx.VPxIkSolverNode):
+            def solverTypeName(self):
+                return 'chainSolver'
+        assert host.call(Named(), 'VPxIkSolverNode::solverTypeName') == 'chainSolver'
+        assert host.call(Solver(), 'VPxIkSolverNode::solverTypeName') == ''
+
+    def test_deformation_details_come_back_as_flags(self):
+        class UVs(vpx.VPxDeformerNode):
+            def getDeformationDetails(self):
+                return vpx.VPxGeometryFilter.kDeformsUVs
+        assert host.call(UVs(), 'VPxGeometryFilter::getDeformationDetails') == 2
+        plain = vpx.VPxBlendShape()
+        plain.setDeformationDetails(vpx.VPxGeometryFilter.kDeformsColors)
+        assert host.call(plain, 'VPxGeometryFilter::getDeformationDetails') == 4
+
+    def test_an_override_written_for_the_short_form_is_not_given_the_context(self):
+        calls = []
+
+        class Shape(vpx.VPxSurfaceShape):
+            def validateAndSetValue(self, plug, handle):
+                calls.append(plug)
+                return True
+        shape = Shape()
+        args = (ov.VPlug(), ov.VDataHandle())
+        assert host.call(shape, 'VPxSurfaceShape::validateAndSetValue', *args) is True
+        # The context form is the host's own, which asks the short form.
+        assert host.call(shape, 'VPxSurfaceShape::validateAndSetValue', *args,
+                         ov.VDGContext()) is True
+        assert len(calls) == 2
