@@ -9,6 +9,9 @@ OPENVORLA_NAMESPACE_OPEN
 VPxCameraSet::VPxCameraSet() { standin::noteConstructed("VPxCameraSet"); }
 VPxCameraSet::~VPxCameraSet() { standin::noteDestroyed("VPxCameraSet"); }
 
+VPxNode::Type VPxCameraSet::type() const { return kCameraSetNode; }
+const char *VPxCameraSet::className() { return "VPxCameraSet"; }
+
 VObject VPxCameraSet::cameraLayer = standin::makeAttribute("VPxCameraSet.cameraLayer");
 VObject VPxCameraSet::camera = standin::makeAttribute("VPxCameraSet.camera");
 VObject VPxCameraSet::sceneData = standin::makeAttribute("VPxCameraSet.sceneData");

@@ -9,6 +9,18 @@ OPENVORLA_NAMESPACE_OPEN
 VPxImagePlane::VPxImagePlane() { standin::noteConstructed("VPxImagePlane"); }
 VPxImagePlane::~VPxImagePlane() { standin::noteDestroyed("VPxImagePlane"); }
 
+VPxNode::Type VPxImagePlane::type() const { return kImagePlaneNode; }
+
+VStatus VPxImagePlane::loadImageMap(const VString &, int, VImage &) {
+  return VStatus::kNotImplemented;
+}
+
+// The stand-in draws no image planes: there is nothing to load again.
+VStatus VPxImagePlane::setImageDirty() { return VStatus::kSuccess; }
+VStatus VPxImagePlane::refreshImage() { return VStatus::kSuccess; }
+VString VPxImagePlane::exactImageFile() const { return VString(); }
+const char *VPxImagePlane::className() { return "VPxImagePlane"; }
+
 VObject VPxImagePlane::imageType = standin::makeAttribute("VPxImagePlane.imageType");
 VObject VPxImagePlane::imageName = standin::makeAttribute("VPxImagePlane.imageName");
 VObject VPxImagePlane::useFrameExtension =

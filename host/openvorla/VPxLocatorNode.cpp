@@ -6,8 +6,34 @@
 
 OPENVORLA_NAMESPACE_OPEN
 
-VPxLocatorNode::VPxLocatorNode() { standin::noteConstructed("VPxLocatorNode"); }
+VPxLocatorNode::VPxLocatorNode() : fColor(1.0f, 1.0f, 1.0f), fActiveColor(0.26f, 1.0f, 0.64f) {
+  standin::noteConstructed("VPxLocatorNode");
+}
+
 VPxLocatorNode::~VPxLocatorNode() { standin::noteDestroyed("VPxLocatorNode"); }
+
+VPxNode::Type VPxLocatorNode::type() const { return kLocatorNode; }
+bool VPxLocatorNode::isBounded() const { return false; }
+VBoundingBox VPxLocatorNode::boundingBox() const { return VBoundingBox(); }
+bool VPxLocatorNode::excludeAsLocator() const { return false; }
+bool VPxLocatorNode::isTransparent() const { return false; }
+bool VPxLocatorNode::drawLast() const { return false; }
+bool VPxLocatorNode::isAlwaysOnTop() const { return false; }
+bool VPxLocatorNode::useClosestPointForSelection() const { return false; }
+VPoint VPxLocatorNode::closestPoint(VPoint, VVector) const { return VPoint(); }
+
+VSelectionMask VPxLocatorNode::getShapeSelectionMask() const {
+  return VSelectionMask(VSelectionMask::kSelectLocators);
+}
+
+VColor VPxLocatorNode::color(bool active) const { return active ? fActiveColor : fColor; }
+void VPxLocatorNode::setColor(const VColor &color, bool active) {
+  (active ? fActiveColor : fColor) = color;
+}
+
+// The stand-in has no selection of instances.
+bool VPxLocatorNode::isSelected(const VDagPath &) const { return false; }
+const char *VPxLocatorNode::className() { return "VPxLocatorNode"; }
 
 VObject VPxLocatorNode::underWorldObject =
     standin::makeAttribute("VPxLocatorNode.underWorldObject");

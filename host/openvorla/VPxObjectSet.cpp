@@ -9,6 +9,10 @@ OPENVORLA_NAMESPACE_OPEN
 VPxObjectSet::VPxObjectSet() { standin::noteConstructed("VPxObjectSet"); }
 VPxObjectSet::~VPxObjectSet() { standin::noteDestroyed("VPxObjectSet"); }
 
+VPxNode::Type VPxObjectSet::type() const { return kObjectSet; }
+bool VPxObjectSet::canBeDeleted(bool) { return true; }
+const char *VPxObjectSet::className() { return "VPxObjectSet"; }
+
 VObject VPxObjectSet::dagSetMembers = standin::makeAttribute("VPxObjectSet.dagSetMembers");
 VObject VPxObjectSet::DNSetMembers = standin::makeAttribute("VPxObjectSet.DNSetMembers");
 VObject VPxObjectSet::memberWireframeColor =

@@ -7,7 +7,10 @@
 
 OPENVORLA_NAMESPACE_OPEN
 
-VPxSurfaceShape::VPxSurfaceShape() { standin::noteConstructed("VPxSurfaceShape"); }
+VPxSurfaceShape::VPxSurfaceShape() : fRenderable(true) {
+  standin::noteConstructed("VPxSurfaceShape");
+}
+
 VPxSurfaceShape::~VPxSurfaceShape() { standin::noteDestroyed("VPxSurfaceShape"); }
 
 VPxNode::Type VPxSurfaceShape::type() const { return kSurfaceShape; }
@@ -48,6 +51,67 @@ bool VPxSurfaceShape::acceptsGeometryIterator(VObject &, bool, bool) { return fa
 VPxGeometryIterator *VPxSurfaceShape::geometryIteratorSetup(VObjectArray &, VObject &, bool) {
   return nullptr;
 }
+
+void VPxSurfaceShape::closestPoint(const VPoint &, VPoint &theClosestPoint, double) const {
+  theClosestPoint = VPoint();
+}
+
+bool VPxSurfaceShape::closestPoint(const VPoint &, const VVector &, VPoint &, VVector &,
+                                   bool) const {
+  return false;
+}
+
+bool VPxSurfaceShape::validateAndSetValue(const VPlug &, const VDataHandle &) { return false; }
+
+// Without a context the plain form decides, as the host does for the normal context.
+bool VPxSurfaceShape::validateAndSetValue(const VPlug &plug, const VDataHandle &handle,
+                                          const VDGContext &) {
+  return validateAndSetValue(plug, handle);
+}
+
+void VPxSurfaceShape::componentToPlugs(VObject &, VSelectionList &) const {}
+bool VPxSurfaceShape::convertToTweakNodePlug(VPlug &) { return false; }
+bool VPxSurfaceShape::deleteComponents(const VObjectArray &, VDoubleArray &) { return false; }
+bool VPxSurfaceShape::undeleteComponents(const VObjectArray &, VDoubleArray &) { return false; }
+
+void VPxSurfaceShape::transformUsing(const VMatrix &, const VObjectArray &, PointCachingMode,
+                                     VPointArray *) {}
+
+void VPxSurfaceShape::tweakUsing(const VMatrix &, const VObjectArray &, PointCachingMode,
+                                 VPointArray *, VArrayDataHandle &) {}
+
+void VPxSurfaceShape::weightedTransformUsing(const VTransformationMatrix &, const VMatrix *,
+                                             const VObjectArray &, PointCachingMode, VPointArray *,
+                                             const VPlane *) {}
+
+void VPxSurfaceShape::weightedTweakUsing(const VTransformationMatrix &, const VMatrix *,
+                                         const VObjectArray &, PointCachingMode, VPointArray *,
+                                         const VPlane *, VArrayDataHandle &) {}
+
+bool VPxSurfaceShape::vertexOffsetDirection(VObject &, VVectorArray &, VectorEndPoint, bool) {
+  return false;
+}
+
+VObject VPxSurfaceShape::newControlPointComponent() { return VObject(); }
+VFn::Type VPxSurfaceShape::renderGroupComponentType() const { return VFn::kInvalid; }
+VObject VPxSurfaceShape::createFullRenderGroup() const { return VObject(); }
+bool VPxSurfaceShape::excludeAsPluginShape() const { return false; }
+bool VPxSurfaceShape::canMakeLive() const { return false; }
+
+// The stand-in has no component selection.
+bool VPxSurfaceShape::hasActiveComponents() const { return false; }
+VObjectArray VPxSurfaceShape::activeComponents() const { return VObjectArray(); }
+void VPxSurfaceShape::childChanged(VChildChanged) {}
+VMatrix VPxSurfaceShape::getWorldMatrix(VDataBlock &, unsigned int) { return VMatrix(); }
+bool VPxSurfaceShape::isRenderable() const { return fRenderable; }
+
+VStatus VPxSurfaceShape::setRenderable(bool renderable) {
+  fRenderable = renderable;
+  return VStatus::kSuccess;
+}
+
+void VPxSurfaceShape::setGeometryDrawDirty(bool) {}
+const char *VPxSurfaceShape::className() { return "VPxSurfaceShape"; }
 
 VObject VPxSurfaceShape::mHasHistoryOnCreate =
     standin::makeAttribute("VPxSurfaceShape.mHasHistoryOnCreate");

@@ -9,6 +9,15 @@ OPENVORLA_NAMESPACE_OPEN
 VPxBlendShape::VPxBlendShape() { standin::noteConstructed("VPxBlendShape"); }
 VPxBlendShape::~VPxBlendShape() { standin::noteDestroyed("VPxBlendShape"); }
 
+VPxNode::Type VPxBlendShape::type() const { return kBlendShape; }
+
+VStatus VPxBlendShape::deformData(VDataBlock &, VDataHandle, unsigned int, const VMatrix &,
+                                  unsigned int) {
+  return VStatus::kNotImplemented;
+}
+
+const char *VPxBlendShape::className() { return "VPxBlendShape"; }
+
 VObject VPxBlendShape::weight = standin::makeAttribute("VPxBlendShape.weight");
 VObject VPxBlendShape::inputTarget = standin::makeAttribute("VPxBlendShape.inputTarget");
 VObject VPxBlendShape::inputTargetGroup = standin::makeAttribute("VPxBlendShape.inputTargetGroup");

@@ -4,10 +4,65 @@
 #include <standin/Lifetime.h>
 #include <standin/Objects.h>
 
+#include <cmath>
+
 OPENVORLA_NAMESPACE_OPEN
 
 VPxMotionPathNode::VPxMotionPathNode() { standin::noteConstructed("VPxMotionPathNode"); }
 VPxMotionPathNode::~VPxMotionPathNode() { standin::noteDestroyed("VPxMotionPathNode"); }
+
+namespace {
+
+VStatus *succeed(VStatus *ReturnStatus) {
+  if (ReturnStatus) *ReturnStatus = VStatus::kSuccess;
+  return ReturnStatus;
+}
+
+double wrapped(double value) { return value - std::floor(value); }
+
+}  // namespace
+
+// The stand-in's paths are the unit segment along x, run at constant speed.
+VPoint VPxMotionPathNode::position(VDataBlock &block, VStatus *ReturnStatus) {
+  return position(block.inputValue(uValue).asDouble(), ReturnStatus);
+}
+
+VPoint VPxMotionPathNode::position(double u, VStatus *ReturnStatus) {
+  succeed(ReturnStatus);
+  return VPoint(u, 0.0, 0.0);
+}
+
+VStatus VPxMotionPathNode::getVectors(VDataBlock &, VVector &front, VVector &side, VVector &up) {
+  front = VVector(1.0, 0.0, 0.0);
+  side = VVector(0.0, 0.0, 1.0);
+  up = VVector(0.0, 1.0, 0.0);
+  return VStatus::kSuccess;
+}
+
+double VPxMotionPathNode::parametricToFractional(double u, VStatus *ReturnStatus) {
+  succeed(ReturnStatus);
+  return u;
+}
+
+double VPxMotionPathNode::fractionalToParametric(double fraction, VStatus *ReturnStatus) {
+  succeed(ReturnStatus);
+  return fraction;
+}
+
+double VPxMotionPathNode::wraparoundFractionalValue(double fraction) { return wrapped(fraction); }
+double VPxMotionPathNode::wraparoundParametricValue(double u) { return wrapped(u); }
+
+VMatrix VPxMotionPathNode::matrix(VDataBlock &block, VStatus *ReturnStatus) {
+  succeed(ReturnStatus);
+  return VMatrix().setTranslation(position(block).asVector());
+}
+
+VObject VPxMotionPathNode::pathObject(VDataBlock &, VStatus *ReturnStatus) {
+  succeed(ReturnStatus);
+  return VObject();
+}
+
+const char *VPxMotionPathNode::className() { return "VPxMotionPathNode"; }
 
 VObject VPxMotionPathNode::uValue = standin::makeAttribute("VPxMotionPathNode.uValue");
 VObject VPxMotionPathNode::frontTwist = standin::makeAttribute("VPxMotionPathNode.frontTwist");

@@ -9,6 +9,39 @@ OPENVORLA_NAMESPACE_OPEN
 VPxFieldNode::VPxFieldNode() { standin::noteConstructed("VPxFieldNode"); }
 VPxFieldNode::~VPxFieldNode() { standin::noteDestroyed("VPxFieldNode"); }
 
+VPxNode::Type VPxFieldNode::type() const { return kFieldNode; }
+
+VStatus VPxFieldNode::getForceAtPoint(const VPointArray &, const VVectorArray &,
+                                      const VDoubleArray &, VVectorArray &, double) {
+  return VStatus::kNotImplemented;
+}
+
+VStatus VPxFieldNode::iconSizeAndOrigin(unsigned int &width, unsigned int &height,
+                                        unsigned int &xbo, unsigned int &ybo) {
+  width = height = xbo = ybo = 0;
+  return VStatus::kSuccess;
+}
+
+// An icon of no pixels has no bytes to fill.
+VStatus VPxFieldNode::iconBitmap(unsigned char *) { return VStatus::kSuccess; }
+bool VPxFieldNode::drawIcon() const { return false; }
+
+VStatus VPxFieldNode::falloffCurve(double param, double &value) {
+  double clamped = param < 0.0 ? 0.0 : param > 1.0 ? 1.0 : param;
+  value = isFalloffCurveConstantOne() ? 1.0 : 1.0 - clamped;
+  return VStatus::kSuccess;
+}
+
+bool VPxFieldNode::isFalloffCurveConstantOne() { return false; }
+
+// The stand-in does not place fields in the scene.
+VStatus VPxFieldNode::getWorldMatrix(VMatrix &matrix) const {
+  matrix.setToIdentity();
+  return VStatus::kSuccess;
+}
+
+const char *VPxFieldNode::className() { return "VPxFieldNode"; }
+
 VObject VPxFieldNode::mMagnitude = standin::makeAttribute("VPxFieldNode.mMagnitude");
 VObject VPxFieldNode::mAttenuation = standin::makeAttribute("VPxFieldNode.mAttenuation");
 VObject VPxFieldNode::mMaxDistance = standin::makeAttribute("VPxFieldNode.mMaxDistance");

@@ -13,6 +13,21 @@ VPxParticleAttributeMapperNode::~VPxParticleAttributeMapperNode() {
   standin::noteDestroyed("VPxParticleAttributeMapperNode");
 }
 
+VPxNode::Type VPxParticleAttributeMapperNode::type() const { return kParticleAttributeMapperNode; }
+
+VStatus VPxParticleAttributeMapperNode::compute(const VPlug &plug, VDataBlock &dataBlock) {
+  if (plug.attribute() != outValuePP) return VStatus::kUnknownParameter;
+  double u = dataBlock.inputValue(uCoordPP).asDouble();
+  double low = dataBlock.inputValue(outMinValue).asDouble();
+  double high = dataBlock.inputValue(outMaxValue).asDouble();
+  VDataHandle out = dataBlock.outputValue(outValuePP);
+  out.setDouble(low + u * (high - low));
+  out.setClean();
+  return VStatus::kSuccess;
+}
+
+const char *VPxParticleAttributeMapperNode::className() { return "VPxParticleAttributeMapperNode"; }
+
 VObject VPxParticleAttributeMapperNode::computeNode =
     standin::makeAttribute("VPxParticleAttributeMapperNode.computeNode");
 VObject VPxParticleAttributeMapperNode::uCoordPP =

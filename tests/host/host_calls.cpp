@@ -11,7 +11,10 @@
 #include <openvorla/VPlug.h>
 #include <openvorla/VPxCommand.h>
 #include <openvorla/VPxData.h>
+#include <openvorla/VPxGeometryFilter.h>
+#include <openvorla/VPxIkSolverNode.h>
 #include <openvorla/VPxNode.h>
+#include <openvorla/VPxSurfaceShape.h>
 #include <openvorla/VPxContext.h>
 #include <openvorla/VPxContextCommand.h>
 #include <openvorla/VPxTransform.h>
@@ -104,6 +107,26 @@ const std::map<std::string, Binder> &Operations() {
        [](PyObject *self, PyObject *) -> HostCall {
          auto &node = Object<VPxNode>(self, "_p_VPxNode");
          return [&] { return Texts(node.getFilesToArchive()); };
+       }},
+      {"VPxIkSolverNode::solverTypeName",
+       [](PyObject *self, PyObject *) -> HostCall {
+         auto &solver = Object<VPxIkSolverNode>(self, "_p_VPxIkSolverNode");
+         return [&] { return Text(solver.solverTypeName()); };
+       }},
+      {"VPxGeometryFilter::getDeformationDetails",
+       [](PyObject *self, PyObject *) -> HostCall {
+         auto &filter = Object<VPxGeometryFilter>(self, "_p_VPxGeometryFilter");
+         return [&] { return Received(static_cast<long long>(filter.getDeformationDetails())); };
+       }},
+      {"VPxSurfaceShape::validateAndSetValue",
+       [](PyObject *self, PyObject *args) -> HostCall {
+         auto &shape = Object<VPxSurfaceShape>(self, "_p_VPxSurfaceShape");
+         auto &plug = Object<VPlug>(Arg(args, 0), "_p_VPlug");
+         auto &handle = Object<VDataHandle>(Arg(args, 1), "_p_VDataHandle");
+         if (PyTuple_GET_SIZE(args) < 3)
+           return [&] { return Received(shape.validateAndSetValue(plug, handle)); };
+         auto &context = Object<VDGContext>(Arg(args, 2), "_p_VDGContext");
+         return [&] { return Received(shape.validateAndSetValue(plug, handle, context)); };
        }},
       {"VPxCommand::doIt",
        [](PyObject *self, PyObject *args) -> HostCall {

@@ -1442,6 +1442,7 @@ int main() {
   testAttributeSets();
   testGraph();
   testEngines();
+  testNodeClasses();
 
   Py_InitializeEx(0);
   PyThreadState *mainThread = PyEval_SaveThread();

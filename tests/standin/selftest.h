@@ -16,3 +16,5 @@ inline bool contains(const std::string &text, const char *part) {
 void testAttributeSets();
 void testGraph();
 void testEngines();
+// node_selftest.cpp: the node proxy classes' defaults and the values they pass.
+void testNodeClasses();

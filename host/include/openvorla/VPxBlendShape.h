@@ -2,8 +2,12 @@
 #pragma once
 
 #include <openvorla/VApiVersion.h>
+#include <openvorla/VDataBlock.h>
+#include <openvorla/VDataHandle.h>
+#include <openvorla/VMatrix.h>
 #include <openvorla/VObject.h>
 #include <openvorla/VPxGeometryFilter.h>
+#include <openvorla/VStatus.h>
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -11,6 +15,13 @@ class OPENVORLA_EXPORT VPxBlendShape : public VPxGeometryFilter {
 public:
   VPxBlendShape();
   ~VPxBlendShape() override;
+
+  VPxNode::Type type() const override;  // kBlendShape
+  // Blends the targets into the geometry geomData of the group groupId;
+  // kNotImplemented: the host blends them itself.
+  virtual VStatus deformData(VDataBlock &block, VDataHandle geomData, unsigned int groupId,
+                             const VMatrix &mat, unsigned int multiIndex);
+  static const char *className();
 
   static VObject weight;
   static VObject inputTarget;

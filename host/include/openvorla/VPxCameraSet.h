@@ -12,6 +12,9 @@ public:
   VPxCameraSet();
   ~VPxCameraSet() override;
 
+  VPxNode::Type type() const override;  // kCameraSetNode
+  static const char *className();
+
   static VObject cameraLayer;
   static VObject camera;
   static VObject sceneData;

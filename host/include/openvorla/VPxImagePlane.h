@@ -4,13 +4,31 @@
 #include <openvorla/VApiVersion.h>
 #include <openvorla/VObject.h>
 #include <openvorla/VPxNode.h>
+#include <openvorla/VStatus.h>
+#include <openvorla/VString.h>
 
 OPENVORLA_NAMESPACE_OPEN
+
+class VImage;
 
 class OPENVORLA_EXPORT VPxImagePlane : public VPxNode {
 public:
   VPxImagePlane();
   ~VPxImagePlane() override;
+
+  VPxNode::Type type() const override;  // kImagePlaneNode
+
+  // Loads the frame of the image file into image. kNotImplemented: the host
+  // loads the file itself.
+  virtual VStatus loadImageMap(const VString &fileName, int frame, VImage &image);
+  // Marks the image as changed, so that the host loads it again when it
+  // draws; refreshImage loads it at once.
+  VStatus setImageDirty();
+  VStatus refreshImage();
+  // The file the plane shows at the current frame, frame extension applied;
+  // empty while the node has no image name.
+  VString exactImageFile() const;
+  static const char *className();
 
   static VObject imageType;
   static VObject imageName;

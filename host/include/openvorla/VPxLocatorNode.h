@@ -2,8 +2,14 @@
 #pragma once
 
 #include <openvorla/VApiVersion.h>
+#include <openvorla/VBoundingBox.h>
+#include <openvorla/VColor.h>
+#include <openvorla/VDagPath.h>
 #include <openvorla/VObject.h>
+#include <openvorla/VPoint.h>
 #include <openvorla/VPxNode.h>
+#include <openvorla/VSelectionMask.h>
+#include <openvorla/VVector.h>
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -11,6 +17,33 @@ class OPENVORLA_EXPORT VPxLocatorNode : public VPxNode {
 public:
   VPxLocatorNode();
   ~VPxLocatorNode() override;
+
+  VPxNode::Type type() const override;  // kLocatorNode
+
+  // The box the locator draws in, in its own space; not bounded by default.
+  virtual bool isBounded() const;
+  virtual VBoundingBox boundingBox() const;
+  // True keeps the locator out of the host's list of locators.
+  virtual bool excludeAsLocator() const;
+  // Drawing order: transparent locators after the opaque ones, drawLast
+  // ones after everything, always-on-top ones over the scene.
+  virtual bool isTransparent() const;
+  virtual bool drawLast() const;
+  virtual bool isAlwaysOnTop() const;
+  // With useClosestPointForSelection, the host selects through closestPoint
+  // (the point of the locator nearest the cursor's ray) instead of drawing.
+  virtual bool useClosestPointForSelection() const;
+  virtual VPoint closestPoint(VPoint cursorRayPoint, VVector cursorRayDir) const;
+  // What selects the locator: kSelectLocators by default.
+  virtual VSelectionMask getShapeSelectionMask() const;
+
+  // The color the locator is drawn in, active (selected) or not; white and
+  // light green until set.
+  VColor color(bool active) const;
+  void setColor(const VColor &color, bool active);
+  // Whether the instance of the locator at path is selected.
+  bool isSelected(const VDagPath &path) const;
+  static const char *className();
 
   static VObject underWorldObject;
   static VObject localPosition;
@@ -58,6 +91,10 @@ public:
   static VObject objectGroupColor;
   static VObject useObjectColor;
   static VObject objectColor;
+
+private:
+  VColor fColor;
+  VColor fActiveColor;
 };
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -12,6 +12,12 @@ public:
   VPxObjectSet();
   ~VPxObjectSet() override;
 
+  VPxNode::Type type() const override;  // kObjectSet
+  // Whether the host may delete the set when its last member goes (as the
+  // source of a connection with isSrcNode); true by default.
+  virtual bool canBeDeleted(bool isSrcNode);
+  static const char *className();
+
   static VObject dagSetMembers;
   static VObject DNSetMembers;
   static VObject memberWireframeColor;

@@ -2,8 +2,11 @@
 #pragma once
 
 #include <openvorla/VApiVersion.h>
+#include <openvorla/VDataBlock.h>
 #include <openvorla/VObject.h>
+#include <openvorla/VPlug.h>
 #include <openvorla/VPxNode.h>
+#include <openvorla/VStatus.h>
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -11,6 +14,12 @@ class OPENVORLA_EXPORT VPxParticleAttributeMapperNode : public VPxNode {
 public:
   VPxParticleAttributeMapperNode();
   ~VPxParticleAttributeMapperNode() override;
+
+  VPxNode::Type type() const override;  // kParticleAttributeMapperNode
+  // Maps outValuePP linearly from the particles' uCoordPP into
+  // [outMinValue, outMaxValue]; the other plugs are the host's.
+  VStatus compute(const VPlug &plug, VDataBlock &dataBlock) override;
+  static const char *className();
 
   static VObject computeNode;
   static VObject uCoordPP;

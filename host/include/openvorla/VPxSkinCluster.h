@@ -12,6 +12,12 @@ public:
   VPxSkinCluster();
   ~VPxSkinCluster() override;
 
+  VPxNode::Type type() const override;  // kSkinCluster
+  // The weight of point wtIndex of the geometry multiIndex, from weightList;
+  // 1 where no weight is set.
+  float weightValue(VDataBlock &block, unsigned int multiIndex, unsigned int wtIndex);
+  static const char *className();
+
   static VObject weightList;
   static VObject weights;
   static VObject matrix;
