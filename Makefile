@@ -30,7 +30,7 @@ build-asan: deps $(ASAN_BUILD)/build.ninja
 # interpreter allocates through malloc so that its objects are checked too,
 # and leaks are not reported (the interpreter keeps much until exit).
 SANITIZED := LD_PRELOAD=$$(gcc -print-file-name=libasan.so):$$(gcc -print-file-name=libubsan.so) \
-	ASAN_OPTIONS=detect_leaks=0:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1 \
+	ASAN_OPTIONS=detect_leaks=0:abort_on_error=1:allocator_may_return_null=1 UBSAN_OPTIONS=print_stacktrace=1 \
 	PYTHONMALLOC=malloc
 
 # Every test on the plain build, then on the sanitizer build with the demo.

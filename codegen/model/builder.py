@@ -2,6 +2,7 @@
 from __future__ import annotations
 
 import codecs
+import keyword
 
 from ..manifest import Manifest
 from ..parse import Class, CType, Function, Headers, Param, Variable
@@ -126,8 +127,8 @@ class Builder:
         refuse = cls.abstract or (bool(cls.constructors) and not public)
         if not director and refuse:
             return None
-        usable = [c for c in cls.constructors if c.access == 'public'
-                  or (director and c.access == 'protected')]
+        usable = [c for c in cls.constructors if (c.access == 'public'
+                  or (director and c.access == 'protected')) and not _moves(c)]
         if not cls.constructors:
             usable = [Function(cls.name, 'public', [])]
         # A value class is copied from Python; a class Python derives from is not.
@@ -145,11 +146,13 @@ class Builder:
         from (open only inside their own override)."""
         groups: dict[str, list[Function]] = {}
         for fn in cls.methods:
+            # Host text converts to and from str, which compares itself.
             if fn.name in COMPARISONS and fn.access == 'public' and len(fn.params) == 1 and \
-                    fn.params[0].type.kind == 'lvref' and fn.params[0].type.inner.name == cls.name:
+                    fn.params[0].type.kind == 'lvref' and fn.params[0].type.inner.name == cls.name \
+                    and cls.name not in (conversions.STRING, conversions.STRING_ARRAY):
                 groups.setdefault(fn.name, []).append(fn)
                 continue
-            if fn.name.startswith('operator') or not (
+            if fn.name.startswith('operator') or _moves(fn) or not (
                     fn.access == 'public' or (director and fn.access == 'protected')):
                 continue
             if f'{cls.name}::{fn.name}' in self.m.skip:
@@ -163,7 +166,9 @@ class Builder:
             entry = f'{cls.name}_{python_name}'
             ep = self.entry_point(entry, fns, lambda fn, fname: self.candidate(
                 cls.name, fn, entry, fname, 1 if fn.static else 2, ctor=False))
-            ep.member, ep.static = python_name, fns[0].static
+            # A Python keyword cannot name an attribute: it gets a trailing '_'.
+            ep.member = python_name + '_' if keyword.iskeyword(python_name) else python_name
+            ep.static = fns[0].static
             ep.comparison = name in COMPARISONS
             for c, fn in zip(ep.candidates, fns):
                 c.virtual, c.pure = director and fn.virtual, fn.pure
@@ -375,6 +380,12 @@ class Builder:
             raise GeneratorError(f'{name} is not a string macro of the headers')
         raw = codecs.escape_decode(text[1:-1].encode())[0]
         return raw.decode('utf-8', 'surrogateescape')
+
+
+def _moves(f: Function) -> bool:
+    """Python has no object to move from: members taking an rvalue reference
+    are not wrapped."""
+    return any(p.type.kind == 'rvref' for p in f.params)
 
 
 def _is_copy(f: Function, cls: str) -> bool:

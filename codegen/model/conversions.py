@@ -39,11 +39,14 @@ def _is(t: CType, kind: str, name: str | None = None) -> bool:
     return t.kind == kind and (name is None or t.name == name)
 
 
-def _scalar_default(t: CType, text: str) -> str | None:
+def _scalar_default(t: CType, text: str, scope: str = '') -> str | None:
     """A default argument usable outside the class: a literal, or an
-    enumerator qualified by its enumeration's scope."""
+    enumerator qualified by its enumeration's scope (or, for a plain number,
+    by the class whose member it is)."""
     if _LITERAL.fullmatch(text):
         return text
+    if t.kind == 'builtin' and scope and re.fullmatch(r'[A-Za-z_]\w*', text):
+        return f'{scope}::{text}'
     if t.kind == 'enum' and re.fullmatch(r'[A-Za-z_]\w*', text):
         scope = t.name.rpartition('::')[0]
         return f'{scope}::{text}' if scope else text
@@ -94,7 +97,7 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
         s = spell(unqualified(t))
         default = None
         if p.default is not None:
-            default = _scalar_default(scalar, p.default)
+            default = _scalar_default(scalar, p.default, scope)
             if default is None:
                 raise unsupported()
         if scalar.kind == 'enum':

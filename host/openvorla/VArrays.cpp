@@ -3,8 +3,7 @@
 #include <openvorla/VIntArray.h>
 #include <openvorla/VObjectArray.h>
 
-#include <stdexcept>
-#include <string>
+#include "ArrayLength.h"
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -24,23 +23,13 @@ VStatus removeAt(Vector &v, unsigned int index) {
   return VStatus::kSuccess;
 }
 
-// The longest array the host makes.
-constexpr unsigned int kMaxLength = 1u << 28;
-
-unsigned int checkedLength(unsigned int length) {
-  if (length > kMaxLength)
-    throw std::length_error("an array of " + std::to_string(length) +
-                            " elements is longer than the host allows");
-  return length;
-}
-
 }  // namespace
 
 // The number arrays differ only in their element type.
 #define NUMBER_ARRAY(Class, T)                                                                   \
   Class::Class() = default;                                                                      \
   Class::Class(unsigned int length, T initialValue)                                              \
-      : fElements(checkedLength(length), initialValue) {}                                 \
+      : fElements(standin::checkedLength(length), initialValue) {}                                 \
   Class::Class(const Class &other) = default;                                                    \
   Class::~Class() = default;                                                                     \
   Class &Class::operator=(const Class &other) = default;                                         \
@@ -57,7 +46,7 @@ unsigned int checkedLength(unsigned int length) {
     return VStatus::kSuccess;                                                                    \
   }                                                                                              \
   VStatus Class::setLength(unsigned int length) {                                                \
-    if (length > kMaxLength) return VStatus::kInsufficientMemory;                                \
+    if (length > standin::kMaxArrayLength) return VStatus::kInsufficientMemory;                                \
     fElements.resize(length, T());                                                               \
     return VStatus::kSuccess;                                                                    \
   }                                                                                              \

@@ -31,7 +31,9 @@ bool VEvaluationNode::dirtyPlugExists(const VObject &attribute, VStatus *ReturnS
 }
 
 unsigned int VEvaluationNode::dirtyPlugCount() const { return fDirtyPlugs.length(); }
-VPlug VEvaluationNode::dirtyPlug(unsigned int index) const { return fDirtyPlugs[index]; }
+VPlug VEvaluationNode::dirtyPlug(unsigned int index) const {
+  return index < fDirtyPlugs.length() ? fDirtyPlugs[index] : VPlug();
+}
 
 VNodeCacheSetupInfo::VNodeCacheSetupInfo() {
   std::fill(std::begin(fPreferences), std::end(fPreferences), false);

@@ -2,12 +2,15 @@
 #include <openvorla/VPointArray.h>
 #include <openvorla/VVectorArray.h>
 
+#include "ArrayLength.h"
+
 OPENVORLA_NAMESPACE_OPEN
 
 // The two arrays differ only in their element type.
 #define GEOMETRY_ARRAY(Class, T)                                                                \
   Class::Class() = default;                                                                     \
-  Class::Class(unsigned int length, const T &initialValue) : fElements(length, initialValue) {} \
+  Class::Class(unsigned int length, const T &initialValue)                                      \
+      : fElements(standin::checkedLength(length), initialValue) {}                              \
   Class::Class(const Class &other) = default;                                                   \
   Class::~Class() = default;                                                                    \
   Class &Class::operator=(const Class &other) = default;                                        \
@@ -32,6 +35,7 @@ OPENVORLA_NAMESPACE_OPEN
     return VStatus::kSuccess;                                                                   \
   }                                                                                             \
   VStatus Class::setLength(unsigned int length) {                                               \
+    if (length > standin::kMaxArrayLength) return VStatus::kInsufficientMemory;                 \
     fElements.resize(length, T());                                                              \
     return VStatus::kSuccess;                                                                   \
   }                                                                                             \

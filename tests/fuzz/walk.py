@@ -54,12 +54,13 @@ def python_class(descriptor_name):
     return PYTHON_CLASSES.get(name)
 
 
-def make(cls):
+def make(cls, director=False):
     """An instance of a wrapped class, plain when the host allows it, else of
     a bare Python subclass (a director); None when neither can be made."""
     if cls is vpx.VFnPlugin:
         return vpx.VFnPlugin(host.load_plugin('walk', '/walk.py'))
-    for factory in (cls, type('Walk' + cls.__name__, (cls,), {})):
+    subclass = type('Walk' + cls.__name__, (cls,), {})
+    for factory in ((subclass,) if director else (cls, subclass)):
         try:
             return factory()
         except Exception:
@@ -103,13 +104,17 @@ def check(name, call, problems):
         problems.append(f'{name}: {type(e).__name__}: {e}')
 
 
-def calls_of(entry, ext):
-    """(label, thunk) pairs for one entry point of the model."""
+def calls_of(entry, ext, director):
+    """(label, thunk) pairs for one entry point of the model; members of a
+    class with a director are called on a plain object and on a director."""
     fn = getattr(ext, entry.entry)
     corpus = hostile_values()
-    for candidate in entry.candidates:
+    for candidate, as_director in [(c, False) for c in entry.candidates] + \
+            [(c, True) for c in entry.candidates if director and c.args and c.args[0].is_self]:
         slots = sorted((a for a in candidate.args if a.slot is not None), key=lambda a: a.slot)
         base = [valid(a) for a in slots]
+        if as_director:
+            base[0] = make(python_class(slots[0].descriptor.name), director=True)
         if entry.takes_self:
             base = [None] + base           # the Python object of a constructor
         if slots and slots[0].is_self and base[0] is None:
@@ -136,19 +141,19 @@ def main(shard, shards):
         for c in model.classes:
             for e in ([c.constructor] if c.constructor else []) + c.members:
                 if e.candidates:
-                    entries.append((e, ext))
+                    entries.append((e, ext, c.director))
     problems = []
     mine = [x for k, x in enumerate(entries) if k % shards == shard]
-    for entry, ext in mine:
+    for entry, ext, director in mine:
         print(entry.entry, flush=True)
-        for label, call in calls_of(entry, ext):
+        for label, call in calls_of(entry, ext, director):
             check(label, call, problems)
     # The rest of every module's table: destruction, hand-over, registration
     # helpers and free functions, with every hostile value alone and in pairs.
     for model, ext in modules:
         names = [e.name for e in model.entries if not e.name.endswith('_swigregister')]
         for k, name in enumerate(names):
-            if k % shards != shard or any(name == e.entry for e, _ in entries):
+            if k % shards != shard or any(name == e.entry for e, _, _ in entries):
                 continue
             print(name, flush=True)
             fn = getattr(ext, name)

@@ -24,7 +24,7 @@ public:
   // Whether a dirty plug has this attribute, element plugs included.
   bool dirtyPlugExists(const VObject &attribute, VStatus *ReturnStatus = NULL) const;
   unsigned int dirtyPlugCount() const;
-  // index must be below dirtyPlugCount().
+  // The null plug for an index not below dirtyPlugCount().
   VPlug dirtyPlug(unsigned int index) const;
 
 private:
