@@ -1447,6 +1447,7 @@ int main() {
   testAttributeSets();
   testGraph();
   testEngines();
+  testInterfaceDefaults();
 
   Py_InitializeEx(0);
   PyThreadState *mainThread = PyEval_SaveThread();

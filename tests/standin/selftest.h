@@ -16,3 +16,7 @@ inline bool contains(const std::string &text, const char *part) {
 void testAttributeSets();
 void testGraph();
 void testEngines();
+
+// interface_selftest.cpp: the host's defaults that keep state or check what
+// they are given, in the proxy classes and their value types.
+void testInterfaceDefaults();
