@@ -9,10 +9,26 @@ VColor::VColor(const VColor &other) = default;
 VColor::~VColor() = default;
 VColor &VColor::operator=(const VColor &other) = default;
 
-bool VColor::operator==(const VColor &other) const {
-  return r == other.r && g == other.g && b == other.b && a == other.a;
+float VColor::operator[](unsigned int index) const {
+  return index == 0 ? r : index == 1 ? g : index == 2 ? b : a;
 }
 
-bool VColor::operator!=(const VColor &other) const { return !(*this == other); }
+float &VColor::operator[](unsigned int index) {
+  return index == 0 ? r : index == 1 ? g : index == 2 ? b : a;
+}
+
+VColor VColor::operator+(const VColor &o) const {
+  return VColor(r + o.r, g + o.g, b + o.b, a + o.a);
+}
+VColor VColor::operator*(const VColor &o) const {
+  return VColor(r * o.r, g * o.g, b * o.b, a * o.a);
+}
+VColor VColor::operator*(float s) const { return VColor(r * s, g * s, b * s, a * s); }
+
+bool VColor::operator==(const VColor &o) const {
+  return r == o.r && g == o.g && b == o.b && a == o.a;
+}
+
+bool VColor::operator!=(const VColor &o) const { return !(*this == o); }
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -1,4 +1,4 @@
-// VPxAttributePatternFactory: construction and destruction.
+// VPxAttributePatternFactory: construction, destruction and the class name.
 #include <openvorla/VPxAttributePatternFactory.h>
 
 #include <standin/Lifetime.h>
@@ -11,5 +11,7 @@ VPxAttributePatternFactory::VPxAttributePatternFactory() {
 VPxAttributePatternFactory::~VPxAttributePatternFactory() {
   standin::noteDestroyed("VPxAttributePatternFactory");
 }
+
+const char *VPxAttributePatternFactory::className() { return "VPxAttributePatternFactory"; }
 
 OPENVORLA_NAMESPACE_CLOSE

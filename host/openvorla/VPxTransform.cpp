@@ -33,19 +33,13 @@ T succeed(VStatus *ReturnStatus, T value) {
 
 }  // namespace
 
-VPxTransform::VPxTransform() : fMatrix(nullptr) {
-  for (int i = 0; i < kLimitCount; ++i) {
-    auto type = static_cast<VFnTransform::LimitType>(i);
-    double bound =
-        type >= VFnTransform::kRotateMinX && type <= VFnTransform::kRotateMaxZ ? 2 * M_PI : 1.0;
-    fLimits[i] = isMinimum(type) ? -bound : bound;
-    fLimitEnabled[i] = false;
-  }
+VPxTransform::VPxTransform() : baseTransformationMatrix(nullptr) {
+  resetLimits();
   standin::noteConstructed("VPxTransform");
 }
 
 VPxTransform::~VPxTransform() {
-  delete fMatrix;
+  delete baseTransformationMatrix;
   standin::noteDestroyed("VPxTransform");
 }
 
@@ -56,11 +50,11 @@ VPxTransformationMatrix *VPxTransform::createTransformationMatrix() {
 }
 
 VPxTransformationMatrix &VPxTransform::transformationMatrix() const {
-  if (!fMatrix) {
-    fMatrix = const_cast<VPxTransform *>(this)->createTransformationMatrix();
-    if (!fMatrix) fMatrix = new VPxTransformationMatrix();
+  if (!baseTransformationMatrix) {
+    baseTransformationMatrix = const_cast<VPxTransform *>(this)->createTransformationMatrix();
+    if (!baseTransformationMatrix) baseTransformationMatrix = new VPxTransformationMatrix();
   }
-  return *fMatrix;
+  return *baseTransformationMatrix;
 }
 
 bool VPxTransform::isBounded() const { return false; }
@@ -81,11 +75,6 @@ VStatus VPxTransform::computeLocalTransformation(VPxTransformationMatrix *xform,
   return xform == &own ? VStatus(VStatus::kSuccess) : xform->copyValues(&own);
 }
 
-VStatus VPxTransform::clearLimits() {
-  std::fill(fLimitEnabled, fLimitEnabled + kLimitCount, false);
-  return VStatus::kSuccess;
-}
-
 VStatus VPxTransform::validateAndSetValue(const VPlug &, const VDataHandle &) {
   return VStatus::kUnknownParameter;
 }
@@ -96,6 +85,15 @@ VStatus VPxTransform::validateAndSetValue(const VPlug &plug, const VDataHandle &
 }
 
 VStatus VPxTransform::updateMatrixAttrs(const VDGContext &) { return VStatus::kSuccess; }
+VStatus VPxTransform::updateMatrixAttrs(VObject &, const VDGContext &) { return VStatus::kSuccess; }
+
+void VPxTransform::copyInternalData(VPxNode *node) {
+  VPxNode::copyInternalData(node);
+  auto *original = dynamic_cast<VPxTransform *>(node);
+  if (!original || original == this) return;
+  transformationMatrix().copyValues(&original->transformationMatrix());
+  copyLimits(*original);
+}
 
 VMatrix VPxTransform::getMatrix(VStatus *ReturnStatus) {
   return succeed(ReturnStatus, transformationMatrix().asMatrix());
@@ -422,6 +420,8 @@ VPxTransformationMatrix *VPxTransform::transformationMatrixPtr() const {
   return &transformationMatrix();
 }
 
+bool VPxTransform::hasTransformationMatrix() const { return baseTransformationMatrix != nullptr; }
+
 bool VPxTransform::isLimited(VFnTransform::LimitType type, VStatus *ReturnStatus) const {
   if (!validLimit(type)) {
     if (ReturnStatus) *ReturnStatus = badLimit();
@@ -450,6 +450,27 @@ VStatus VPxTransform::setLimit(VFnTransform::LimitType type, double value) {
 VStatus VPxTransform::enableLimit(VFnTransform::LimitType type, bool flag) {
   if (!validLimit(type)) return badLimit();
   fLimitEnabled[type] = flag;
+  return VStatus::kSuccess;
+}
+
+VStatus VPxTransform::clearLimits() {
+  std::fill(fLimitEnabled, fLimitEnabled + kLimitCount, false);
+  return VStatus::kSuccess;
+}
+
+VStatus VPxTransform::resetLimits() {
+  for (int i = 0; i < kLimitCount; ++i) {
+    auto type = static_cast<VFnTransform::LimitType>(i);
+    double bound =
+        type >= VFnTransform::kRotateMinX && type <= VFnTransform::kRotateMaxZ ? 2 * M_PI : 1.0;
+    fLimits[i] = isMinimum(type) ? -bound : bound;
+  }
+  return clearLimits();
+}
+
+VStatus VPxTransform::copyLimits(const VPxTransform &other) {
+  std::copy(other.fLimits, other.fLimits + kLimitCount, fLimits);
+  std::copy(other.fLimitEnabled, other.fLimitEnabled + kLimitCount, fLimitEnabled);
   return VStatus::kSuccess;
 }
 
@@ -549,6 +570,7 @@ VStatus VPxTransform::dirtyScalePivot(const VPoint &) { return VStatus::kSuccess
 VStatus VPxTransform::dirtyScalePivotTranslation(const VVector &) { return VStatus::kSuccess; }
 VStatus VPxTransform::dirtyRotatePivot(const VPoint &) { return VStatus::kSuccess; }
 VStatus VPxTransform::dirtyRotatePivotTranslation(const VVector &) { return VStatus::kSuccess; }
+VStatus VPxTransform::dirtyLimits() { return VStatus::kSuccess; }
 
 VObject VPxTransform::nodeBoundingBox = standin::makeAttribute("VPxTransform.nodeBoundingBox");
 VObject VPxTransform::nodeBoundingBoxMin =

@@ -48,6 +48,24 @@ VMatrix VPxTransformationMatrix::asRotateMatrix() const { return fValues.asRotat
 VMatrix VPxTransformationMatrix::asRotateMatrixInverse() const {
   return fValues.asRotateMatrix().inverse();
 }
+
+VMatrix VPxTransformationMatrix::asTranslateMatrix() const {
+  VTransformationMatrix translate;
+  translate.setTranslation(fValues.translation());
+  return translate.asMatrix();
+}
+
+VMatrix VPxTransformationMatrix::asTranslateMatrixInverse() const {
+  return asTranslateMatrix().inverse();
+}
+
+VMatrix VPxTransformationMatrix::asShearMatrix() const {
+  VTransformationMatrix shear;
+  shear.setShear(fValues.shear());
+  shear.setScalePivot(fValues.scalePivot(), false);
+  return shear.asScaleMatrix();
+}
+
 VTransformationMatrix VPxTransformationMatrix::asTransformationMatrix() const { return fValues; }
 
 bool VPxTransformationMatrix::isEquivalent(const VPxTransformationMatrix &other) const {
@@ -254,35 +272,11 @@ VQuaternion VPxTransformationMatrix::rotateOrientation() const {
 VPoint VPxTransformationMatrix::rotatePivot() const { return fValues.rotatePivot(); }
 VPoint VPxTransformationMatrix::scalePivot() const { return fValues.scalePivot(); }
 
-VVector VPxTransformationMatrix::rotatePivotTranslation() const {
-  return fValues.rotatePivotTranslation();
+VTransformationMatrix::RotationOrder VPxTransformationMatrix::rotationOrder() const {
+  return fValues.rotationOrder();
 }
 
-VVector VPxTransformationMatrix::scalePivotTranslation() const {
-  return fValues.scalePivotTranslation();
-}
-
-VTypeId VPxTransformationMatrix::typeId() const { return baseTransformationMatrixId; }
 void *VPxTransformationMatrix::creator() { return new VPxTransformationMatrix(); }
-
-VEulerRotation::RotationOrder VPxTransformationMatrix::convertTransformationRotationOrder(
-    VTransformationMatrix::RotationOrder order, VStatus *ReturnStatus) {
-  bool valid = order > VTransformationMatrix::kInvalid && order < VTransformationMatrix::kLast;
-  if (ReturnStatus)
-    *ReturnStatus = valid ? VStatus(VStatus::kSuccess)
-                          : VStatus(VStatus::kInvalidParameter, "Invalid rotation order");
-  return VTransformationMatrix::toEulerOrder(order);
-}
-
-VTransformationMatrix::RotationOrder VPxTransformationMatrix::convertEulerRotationOrder(
-    VEulerRotation::RotationOrder order, VStatus *ReturnStatus) {
-  VTransformationMatrix::RotationOrder converted = VTransformationMatrix::fromEulerOrder(order);
-  if (ReturnStatus)
-    *ReturnStatus = converted != VTransformationMatrix::kInvalid
-                        ? VStatus(VStatus::kSuccess)
-                        : VStatus(VStatus::kInvalidParameter, "Invalid rotation order");
-  return converted;
-}
 
 const VPxTransformationMatrix VPxTransformationMatrix::identity;
 VTypeId VPxTransformationMatrix::baseTransformationMatrixId(0x70000);

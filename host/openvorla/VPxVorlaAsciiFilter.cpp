@@ -24,7 +24,7 @@ LastScene &lastScene() {
   return scene;
 }
 
-// Sets the filter's file for the duration of a read or write.
+// Sets the filter's file for the duration of a write.
 class CurrentFile {
  public:
   CurrentFile(VFileObject &slot, const VFileObject &file) : fSlot(slot) { fSlot = file; }
@@ -38,12 +38,6 @@ class CurrentFile {
 
 VPxVorlaAsciiFilter::VPxVorlaAsciiFilter() { standin::noteConstructed("VPxVorlaAsciiFilter"); }
 VPxVorlaAsciiFilter::~VPxVorlaAsciiFilter() { standin::noteDestroyed("VPxVorlaAsciiFilter"); }
-
-VStatus VPxVorlaAsciiFilter::reader(const VFileObject &file, const VString &, FileAccessMode) {
-  if (!file.isSet()) return VStatus(VStatus::kInvalidParameter, "No file to read");
-  CurrentFile current(fFile, file);
-  return VStatus::kSuccess;
-}
 
 VStatus VPxVorlaAsciiFilter::writer(const VFileObject &file, const VString &, FileAccessMode) {
   if (!file.isSet()) return VStatus(VStatus::kInvalidParameter, "No file to write");
@@ -70,16 +64,16 @@ VStatus VPxVorlaAsciiFilter::writer(const VFileObject &file, const VString &, Fi
   return VStatus::kSuccess;
 }
 
-bool VPxVorlaAsciiFilter::haveReadMethod() const { return true; }
 bool VPxVorlaAsciiFilter::haveWriteMethod() const { return true; }
 VString VPxVorlaAsciiFilter::defaultExtension() const { return "va"; }
+bool VPxVorlaAsciiFilter::writesMetadata() const { return true; }
 
 bool VPxVorlaAsciiFilter::writesRequirements() const { return true; }
 bool VPxVorlaAsciiFilter::writesCreateNode(const VObject &) const { return true; }
+bool VPxVorlaAsciiFilter::writesAddAttr(const VPlug &) const { return true; }
 bool VPxVorlaAsciiFilter::writesSetAttr(const VPlug &) const { return true; }
 bool VPxVorlaAsciiFilter::writesSelectNode(const VObject &) const { return true; }
 bool VPxVorlaAsciiFilter::writesFileReference(const VFileObject &) const { return true; }
-bool VPxVorlaAsciiFilter::writesMetadata() const { return true; }
 
 VStatus VPxVorlaAsciiFilter::writePostHeader(VPxVorlaAsciiFilterOutput &) {
   return VStatus::kSuccess;

@@ -1,4 +1,4 @@
-// VPxMaterialInformation: construction and destruction.
+// VPxMaterialInformation: construction, destruction and the class name.
 #include <openvorla/VPxMaterialInformation.h>
 
 #include <standin/Lifetime.h>
@@ -14,5 +14,7 @@ VPxMaterialInformation::VPxMaterialInformation(VObject &, const VObject &) {
 VPxMaterialInformation::~VPxMaterialInformation() {
   standin::noteDestroyed("VPxMaterialInformation");
 }
+
+const char *VPxMaterialInformation::className() { return "VPxMaterialInformation"; }
 
 OPENVORLA_NAMESPACE_CLOSE

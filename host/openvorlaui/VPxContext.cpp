@@ -17,6 +17,11 @@ VStatus badImage() { return VStatus(VStatus::kInvalidParameter, "No such image i
 }  // namespace
 
 VPxContext::VPxContext() { standin::noteConstructed("VPxContext"); }
+
+VPxContext::VPxContext(const VString &titleString) : fTitle(titleString) {
+  standin::noteConstructed("VPxContext");
+}
+
 VPxContext::~VPxContext() { standin::noteDestroyed("VPxContext"); }
 
 void VPxContext::toolOnSetup(VEvent &) {}
@@ -89,5 +94,12 @@ unsigned int VPxContext::manipulatorCount() const {
 }
 
 const char *VPxContext::className() { return "VPxContext"; }
+
+void VPxContext::selectionChanged() {}
+VStatus VPxContext::drawFeedback(VHWRender::VUIDrawManager &) { return VStatus::kSuccess; }
+VStatus VPxContext::updateManipulators(const VObject &) { return VStatus::kSuccess; }
+
+// The stand-in has no views to show a cursor over.
+VStatus VPxContext::setCursor(const VCursor &) { return VStatus::kSuccess; }
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -20,6 +20,9 @@ VStatus VPxContextCommand::doQueryFlags() { return VStatus::kUnknownParameter; }
 VStatus VPxContextCommand::appendSyntax() { return VStatus::kSuccess; }
 VSyntax &VPxContextCommand::syntax() { return fSyntax; }
 
+// The stand-in never edits or queries a context, so there is no parser.
+VArgParser *VPxContextCommand::parser() { return nullptr; }
+
 VStatus VPxContextCommand::setResult(bool result) {
   VPxCommand::setResult(result);
   return VStatus::kSuccess;

@@ -20,6 +20,9 @@ VStatus VPxControlCommand::appendSyntax() { return VStatus::kSuccess; }
 bool VPxControlCommand::skipFlagForCreate(const VString &) { return false; }
 VSyntax &VPxControlCommand::syntax() { return fSyntax; }
 
+// The stand-in never edits or queries a control, so there is no parser.
+VArgParser *VPxControlCommand::parser() { return nullptr; }
+
 void VPxControlCommand::clearResult() { VPxCommand::clearResult(); }
 void VPxControlCommand::setResult(bool result) { VPxCommand::setResult(result); }
 void VPxControlCommand::setResult(int result) { VPxCommand::setResult(result); }

@@ -23,6 +23,10 @@ VString VPxModelEditorCommand::editorCommandName() const { return VString(); }
 VString VPxModelEditorCommand::editorMenuScriptName() const { return VString(); }
 VSyntax &VPxModelEditorCommand::syntax() { return fSyntax; }
 
+// The stand-in never edits or queries an editor, so there is no parser.
+VArgParser *VPxModelEditorCommand::parser() { return nullptr; }
+VString VPxModelEditorCommand::editorName() const { return VString(); }
+
 VStatus VPxModelEditorCommand::setResult(bool result) {
   VPxCommand::setResult(result);
   return VStatus::kSuccess;

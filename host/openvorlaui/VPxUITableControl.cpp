@@ -24,6 +24,8 @@ VPxUITableControl::VPxUITableControl() : fRows(0), fColumns(0), fSuspended(false
 
 VPxUITableControl::~VPxUITableControl() { standin::noteDestroyed("VPxUITableControl"); }
 
+VStatus VPxUITableControl::collapseOrExpandRows(bool) { return VStatus::kNotImplemented; }
+
 VString VPxUITableControl::cellString(int, int, bool &isValidCell) {
   isValidCell = false;
   return VString();
@@ -111,8 +113,6 @@ VStatus VPxUITableControl::suspendUpdates(bool suspend) {
   fSuspended = suspend;
   return VStatus::kSuccess;
 }
-
-bool VPxUITableControl::updatesSuspended() const { return fSuspended; }
 
 VStatus VPxUITableControl::redrawCells() {
   return fSuspended ? VStatus(VStatus::kFailure, "Updates are suspended") : VStatus::kSuccess;

@@ -18,3 +18,7 @@ void testGraph();
 void testEngines();
 // node_selftest.cpp: the node proxy classes' defaults and the values they pass.
 void testNodeClasses();
+
+// interface_selftest.cpp: the host's defaults that keep state or check what
+// they are given, in the proxy classes and their value types.
+void testInterfaceDefaults();

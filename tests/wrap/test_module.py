@@ -30,7 +30,8 @@ VPxSpringNode VPxParticleAttributeMapperNode VPxRenderPassImpl""".split()
 NO_DIRECTOR = {'VFnPlugin', 'VExternalContentInfoTable', 'VExternalContentLocationTable',
                'VPxVorlaAsciiFilterOutput', 'MaterialInputData'}
 NEW_FLAGS = {'VPxMaterialInformation': METH_VARARGS, 'VFnPlugin': METH_VARARGS,
-             'VPxGeometryIterator': METH_VARARGS}
+             'VPxGeometryIterator': METH_VARARGS, 'VPxRepresentation': METH_VARARGS,
+             'VPxCacheConfigRuleFilter': METH_VARARGS, 'VPxContext': METH_VARARGS}
 
 
 class PyMethodDef(ctypes.Structure):

@@ -6,6 +6,7 @@
 
 #include <openvorla/VApiVersion.h>
 #include <openvorla/VObject.h>
+#include <openvorla/VString.h>
 #include <openvorla/VTime.h>
 
 OPENVORLA_NAMESPACE_OPEN
@@ -24,6 +25,9 @@ public:
   // The curve and the index of the interval's first key; does nothing by default.
   virtual void initialize(const VObject &animCurve, unsigned int interval);
 
+  // The InterpolatorFlags an interpolator type was registered with; 0 for a
+  // type that no loaded plug-in registered.
+  static int registeredFlags(const VString &typeName);
   static const char *className();
 };
 

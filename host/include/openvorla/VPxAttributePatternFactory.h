@@ -18,6 +18,8 @@ public:
   virtual VStatus createPatternsFromString(const VString &definition,
                                            VAttributePatternArray &patterns) = 0;
   virtual VString name() const = 0;
+
+  static const char *className();
 };
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -35,8 +35,6 @@ public:
   virtual VStatus undoIt();
   // What setUndoable() last set; false by default.
   virtual bool isUndoable() const;
-  // True: the command's arguments are checked against its syntax.
-  virtual bool hasSyntax() const;
 
   // Booleans are integer results 0 and 1.
   static void setResult(bool result);
@@ -78,11 +76,17 @@ public:
   // The command line that ran the command, as the host records it.
   VString commandString() const;
   void setCommandString(const VString &command);
+  static const char *className();
+
+protected:
+  // True: the host checks the command's arguments against its syntax before
+  // doIt().
+  virtual bool hasSyntax() const;
+  // The syntax the command was registered with.
   VSyntax syntax() const;
   // Whether the command is echoed to the history; false by default.
   VStatus setHistoryOn(bool historyOn);
   bool isHistoryOn(VStatus *ReturnStatus = NULL) const;
-  static const char *className();
 
 private:
   bool fUndoable;

@@ -17,7 +17,11 @@
 
 OPENVORLA_NAMESPACE_OPEN
 
+class VCursor;
 class VPxToolCommand;
+namespace VHWRender {
+class VUIDrawManager;
+}
 
 class OPENVORLA_EXPORT VPxContext {
 public:
@@ -28,6 +32,8 @@ public:
   };
 
   VPxContext();
+  // With the title the host shows while the context is current.
+  explicit VPxContext(const VString &titleString);
   virtual ~VPxContext();
 
   virtual void toolOnSetup(VEvent &event);
@@ -72,6 +78,19 @@ public:
   VStatus deleteManipulators();
   unsigned int manipulatorCount() const;
   static const char *className();
+
+protected:
+  // The active selection changed while the context is current; does nothing
+  // by default.
+  virtual void selectionChanged();
+  // Draws the context's feedback in the view being drawn; draws nothing and
+  // reports kSuccess by default.
+  virtual VStatus drawFeedback(VHWRender::VUIDrawManager &drawManager);
+  // Makes the manipulators for a node of the selection, with addManipulator();
+  // makes none and reports kSuccess by default.
+  virtual VStatus updateManipulators(const VObject &node);
+  // The cursor the host shows over the views while the context is current.
+  VStatus setCursor(const VCursor &cursor);
 
 private:
   VString fTitle;

@@ -12,6 +12,8 @@
 
 OPENVORLA_NAMESPACE_OPEN
 
+class VArgParser;
+
 class OPENVORLA_EXPORT VPxContextCommand {
 public:
   VPxContextCommand();
@@ -27,12 +29,17 @@ public:
 
   // The syntax the command is parsed with: edit and query enabled, no flags.
   VSyntax &syntax();
+  // The parser of the command line being run, from which doEditFlags and
+  // doQueryFlags read their flags; null outside them.
+  VArgParser *parser();
+  static const char *className();
+
+protected:
   // The result of the command, as VPxCommand::setResult sets it.
   VStatus setResult(bool result);
   VStatus setResult(int result);
   VStatus setResult(double result);
   VStatus setResult(const VString &result);
-  static const char *className();
 
 private:
   VSyntax fSyntax;

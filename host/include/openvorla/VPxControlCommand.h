@@ -12,6 +12,8 @@
 
 OPENVORLA_NAMESPACE_OPEN
 
+class VArgParser;
+
 class OPENVORLA_EXPORT VPxControlCommand {
 public:
   VPxControlCommand();
@@ -30,6 +32,9 @@ public:
 
   // The syntax the command is parsed with: edit and query enabled, no flags.
   VSyntax &syntax();
+  // The parser of the command line being run, from which doEditFlags and
+  // doQueryFlags read their flags; null outside them.
+  VArgParser *parser();
   // The result of the command, as VPxCommand's result functions set it.
   void clearResult();
   void setResult(bool result);

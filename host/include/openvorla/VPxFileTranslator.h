@@ -39,22 +39,27 @@ public:
                          FileAccessMode mode);
   virtual bool haveReadMethod() const;
   virtual bool haveWriteMethod() const;
-  virtual bool haveReferenceMethod() const;
-  virtual bool haveNamespaceSupport() const;
-  // Whether the host may hand several files to one reader call; false by default.
-  virtual bool allowMultipleFileOptimization() const;
   // Without a leading '.'; "" by default.
   virtual VString defaultExtension() const;
   // The file browser's pattern: "*." and the default extension, or "*.*".
   virtual VString filter() const;
-  // Whether a file written by the translator can be opened as a scene; true.
-  virtual bool canBeOpened() const;
   // The file and its first size bytes.
   virtual VFileKind identifyFile(const VFileObject &file, const char *buffer, short size) const;
 
   // The access mode of the file operation that runs; kUnknownAccessMode
   // outside one.
   static FileAccessMode fileAccessMode();
+
+protected:
+  // What the host may do with the translator beyond reading and writing,
+  // which it asks when it lists translators for its file dialogs. Whether
+  // it can load references, keeps the namespaces of what it reads, and may
+  // be handed several files at once: false by default. Whether a file it
+  // wrote can be opened as a scene: true.
+  virtual bool haveReferenceMethod() const;
+  virtual bool haveNamespaceSupport() const;
+  virtual bool allowMultipleFileOptimization() const;
+  virtual bool canBeOpened() const;
 };
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -40,15 +40,19 @@ public:
   virtual int indexUnsimplified() const;
 
   int currentPoint() const;
-  // kInvalidParameter for a negative index.
-  VStatus setCurrentPoint(int index);
   int maxPoints() const;  // 0 until set
-  VStatus setMaxPoints(int count);
   // The shape whose geometry is iterated over.
   VStatus setObject(VPxSurfaceShape &shape);
+  static const char *className();
+
+protected:
+  // For derived iterators: the position and the number of points, each
+  // kInvalidParameter when negative; the shape (null until set) and the
+  // geometry the iterator was made with.
+  VStatus setCurrentPoint(int index);
+  VStatus setMaxPoints(int count);
   VPxSurfaceShape *object() const;
   void *geometry() const;
-  static const char *className();
 
 private:
   void *fGeometry;

@@ -24,6 +24,8 @@ public:
   virtual bool connectAsTexture(int channel, VPlug &texturePlug) = 0;
   virtual bool materialInfoIsDirty(const VPlug &plug) = 0;
   virtual void textureDisconnected(int channel) = 0;
+
+  static const char *className();
 };
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -50,18 +50,22 @@ public:
 
   // Back to the identity (the data block form) or to the components of a matrix.
   virtual void resetTransformation(VDataBlock &block);
-  virtual void resetTransformation(const VMatrix &matrix);
+  void resetTransformation(const VMatrix &matrix);
   // Puts the components of the local transformation into xform: the ones the
   // transform keeps, by default. kInvalidParameter for null.
   virtual VStatus computeLocalTransformation(VPxTransformationMatrix *xform, VDataBlock &block);
-  // Disables every limit.
-  virtual VStatus clearLimits();
   // A value set on one of the transform's plugs; kUnknownParameter by
   // default: the host sets it.
   virtual VStatus validateAndSetValue(const VPlug &plug, const VDataHandle &handle);
   virtual VStatus validateAndSetValue(const VPlug &plug, const VDataHandle &handle,
                                       const VDGContext &context);
+  // Brings the matrix attributes up to date with the components: all of
+  // them, or those that attr affects; kSuccess by default, as the stand-in
+  // computes them when they are read.
   virtual VStatus updateMatrixAttrs(const VDGContext &context);
+  virtual VStatus updateMatrixAttrs(VObject &attr, const VDGContext &context);
+  // A duplicate takes the components and the limits of the original.
+  void copyInternalData(VPxNode *node) override;
 
   virtual VMatrix getMatrix(VStatus *ReturnStatus = NULL);
   virtual VMatrix getMatrix(const VDGContext &context, VStatus *ReturnStatus = NULL);
@@ -185,6 +189,8 @@ public:
                                                    VSpace::Space space);
 
   VPxTransformationMatrix *transformationMatrixPtr() const;
+  // Whether the matrix was made yet; it is made when first asked for.
+  bool hasTransformationMatrix() const;
   // The limits of the components. The host's defaults, all disabled: -1 to 1
   // for translation and scale, -2 pi to 2 pi for rotation. A limit that
   // would pass the other limit of its axis is refused with kInvalidParameter.
@@ -192,6 +198,11 @@ public:
   double limitValue(VFnTransform::LimitType type, VStatus *ReturnStatus = NULL) const;
   VStatus setLimit(VFnTransform::LimitType type, double value);
   VStatus enableLimit(VFnTransform::LimitType type, bool flag);
+  // Disables every limit, keeping its value; or back to the host's defaults.
+  VStatus clearLimits();
+  VStatus resetLimits();
+  // The values and the states of the other transform's limits.
+  VStatus copyLimits(const VPxTransform &other);
 
   // Makes the host call validateAndSetValue() when the attribute is set.
   static void mustCallValidateAndSet(VObject &attr);
@@ -364,6 +375,10 @@ public:
   static VObject rotationInterpolation;
   static VObject offsetParentMatrix;
 
+  // The matrix the transform keeps, made by createTransformationMatrix();
+  // the transform deletes it.
+  mutable VPxTransformationMatrix *baseTransformationMatrix;
+
 protected:
   // The value to set for a component, given the one asked for and the one it
   // has: the saved value for locked axes (none are locked by default), and
@@ -409,10 +424,12 @@ protected:
   VStatus dirtyScalePivotTranslation(const VVector &translation);
   VStatus dirtyRotatePivot(const VPoint &pivot);
   VStatus dirtyRotatePivotTranslation(const VVector &translation);
+  // The limits changed outside setLimit() and enableLimit(); the host
+  // clamps the components again.
+  VStatus dirtyLimits();
 
 private:
   VVector clamp(const VVector &value, VFnTransform::LimitType firstLimit) const;
-  mutable VPxTransformationMatrix *fMatrix;
   double fLimits[18];
   bool fLimitEnabled[18];
 };

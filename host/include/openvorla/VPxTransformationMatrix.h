@@ -39,6 +39,10 @@ public:
   virtual VMatrix asScaleMatrixInverse() const;
   virtual VMatrix asRotateMatrix() const;
   virtual VMatrix asRotateMatrixInverse() const;
+  // The translation alone, and the shear alone about the scale pivot.
+  virtual VMatrix asTranslateMatrix() const;
+  virtual VMatrix asTranslateMatrixInverse() const;
+  virtual VMatrix asShearMatrix() const;
   virtual VTransformationMatrix asTransformationMatrix() const;
   // The composed matrices agree within tolerance (1.0e-10 without one).
   virtual bool isEquivalent(const VPxTransformationMatrix &other) const;
@@ -103,7 +107,14 @@ public:
   // Takes the components of another matrix; kInvalidParameter for null.
   virtual VStatus copyValues(VPxTransformationMatrix *other);
 
-  // The stored components, as the host's implementations read and write them.
+  static void *creator();  // a new VPxTransformationMatrix
+
+  static const VPxTransformationMatrix identity;
+  static VTypeId baseTransformationMatrixId;
+
+protected:
+  // The stored components, for derived matrices to compose their own. The
+  // pivot translations, which balance the pivots, are the getters'.
   VVector translation() const;
   VQuaternion rotation() const;
   VVector scale() const;
@@ -111,18 +122,7 @@ public:
   VQuaternion rotateOrientation() const;
   VPoint rotatePivot() const;
   VPoint scalePivot() const;
-  VVector rotatePivotTranslation() const;
-  VVector scalePivotTranslation() const;
-
-  VTypeId typeId() const;  // baseTransformationMatrixId
-  static void *creator();  // a new VPxTransformationMatrix
-  static VEulerRotation::RotationOrder convertTransformationRotationOrder(
-      VTransformationMatrix::RotationOrder order, VStatus *ReturnStatus = NULL);
-  static VTransformationMatrix::RotationOrder convertEulerRotationOrder(
-      VEulerRotation::RotationOrder order, VStatus *ReturnStatus = NULL);
-
-  static const VPxTransformationMatrix identity;
-  static VTypeId baseTransformationMatrixId;
+  VTransformationMatrix::RotationOrder rotationOrder() const;
 
 private:
   VTransformationMatrix fValues;

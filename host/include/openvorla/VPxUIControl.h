@@ -3,6 +3,8 @@
 #pragma once
 
 #include <openvorla/VApiVersion.h>
+#include <openvorla/VStatus.h>
+#include <openvorla/VString.h>
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -10,10 +12,15 @@ class OPENVORLA_EXPORT VPxUIControl {
 public:
   virtual ~VPxUIControl();
 
-  static const char *className();
-
 protected:
   VPxUIControl();
+
+  // Sets a flag of the host's widget, as the control's command would with
+  // that flag and value; kInvalidParameter for a flag without a name.
+  VStatus setWidgetFlag(const VString &longFlag, bool value);
+  VStatus setWidgetFlag(const VString &longFlag, int value);
+  VStatus setWidgetFlag(const VString &longFlag, double value);
+  VStatus setWidgetFlag(const VString &longFlag, const VString &value);
 };
 
 OPENVORLA_NAMESPACE_CLOSE

@@ -26,15 +26,9 @@ public:
   VPxUITableControl();
   ~VPxUITableControl() override;
 
-  // The text of a cell; "" and isValidCell false by default.
-  virtual VString cellString(int row, int column, bool &isValidCell);
-  // Row and column labels number them from 1 by default; "" for the others.
-  virtual VString labelString(LabelType labelType, int index);
-  // The user typed value into the cell; false by default: the edit is refused.
-  virtual bool setCellString(int row, int column, const VString &value);
-  virtual bool allowEdit(int row, int column) const;  // false
-  // Whether the user may select the rectangle of cells; true by default.
-  virtual bool allowSelection(int top, int left, int bottom, int right) const;
+  // Collapses or expands the groups of rows that the control shows;
+  // kNotImplemented by default: the rows are not grouped.
+  virtual VStatus collapseOrExpandRows(bool collapse);
 
   // Shrinking the table drops the selected cells that it loses.
   VStatus setNumberOfRows(int count);
@@ -56,9 +50,20 @@ public:
   // While updates are suspended the host does not redraw; the redraw
   // requests then fail with kFailure.
   VStatus suspendUpdates(bool suspend);
-  bool updatesSuspended() const;
   VStatus redrawCells();
   VStatus redrawLabels();
+
+protected:
+  // The host asks these as it draws and edits the table.
+  // The text of a cell; "" and isValidCell false by default.
+  virtual VString cellString(int row, int column, bool &isValidCell);
+  // Row and column labels number them from 1 by default; "" for the others.
+  virtual VString labelString(LabelType labelType, int index);
+  // The user typed value into the cell; false by default: the edit is refused.
+  virtual bool setCellString(int row, int column, const VString &value);
+  virtual bool allowEdit(int row, int column) const;  // false
+  // Whether the user may select the rectangle of cells; true by default.
+  virtual bool allowSelection(int top, int left, int bottom, int right) const;
 
 private:
   bool inside(int row, int column) const;

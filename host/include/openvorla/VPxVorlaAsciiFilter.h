@@ -1,7 +1,7 @@
 // Base class of plug-in translators that filter the ASCII scene format.
 //
-// The host reads and writes the format itself. While writing it asks the
-// filter, through the writes* members, whether each statement goes to the
+// The host reads the format itself, without the filter. While writing it asks
+// the filter, through the writes* members, whether each statement goes to the
 // file, and lets it add text of its own at fixed places through the write*
 // members; by default everything is written and nothing is added.
 #pragma once
@@ -26,20 +26,24 @@ public:
   // The writer writes the header, the requirements, the node and connection
   // blocks and the trailer, calling the hooks in that order, and stops at
   // the first hook that fails.
-  VStatus reader(const VFileObject &file, const VString &optionsString,
-                 FileAccessMode mode) override;
   VStatus writer(const VFileObject &file, const VString &optionsString,
                  FileAccessMode mode) override;
-  bool haveReadMethod() const override;   // true
-  bool haveWriteMethod() const override;  // true
+  bool haveWriteMethod() const override;      // true
   VString defaultExtension() const override;  // "va"
 
+  // Whether the file's metadata block is written.
+  virtual bool writesMetadata() const;
+
+protected:
   virtual bool writesRequirements() const;
   virtual bool writesCreateNode(const VObject &node) const;
+  virtual bool writesAddAttr(const VPlug &plug) const;
   virtual bool writesSetAttr(const VPlug &srcPlug) const;
+  virtual bool writesConnectAttr(const VPlug &srcPlug, const VPlug &destPlug) const;
+  virtual bool writesDisconnectAttr(const VPlug &srcPlug, const VPlug &destPlug) const;
+  virtual bool writesParentNode(const VDagPath &parent, const VDagPath &child) const;
   virtual bool writesSelectNode(const VObject &node) const;
   virtual bool writesFileReference(const VFileObject &referenceFile) const;
-  virtual bool writesMetadata() const;
 
   virtual VStatus writePostHeader(VPxVorlaAsciiFilterOutput &fileIO);
   virtual VStatus writePreRequirements(VPxVorlaAsciiFilterOutput &fileIO);
@@ -50,13 +54,8 @@ public:
   virtual VStatus writePostConnectAttrsBlock(VPxVorlaAsciiFilterOutput &fileIO);
   virtual VStatus writePreTrailer(VPxVorlaAsciiFilterOutput &fileIO);
 
-  // The file being read or written; unset outside the reader and the writer.
+  // The file being written; unset outside the writer.
   VFileObject file() const;
-
-protected:
-  virtual bool writesConnectAttr(const VPlug &srcPlug, const VPlug &destPlug) const;
-  virtual bool writesDisconnectAttr(const VPlug &srcPlug, const VPlug &destPlug) const;
-  virtual bool writesParentNode(const VDagPath &parent, const VDagPath &child) const;
 
 private:
   VFileObject fFile;
