@@ -75,6 +75,7 @@ PyObject *Next(PyObject *self, PyObject *) {
 PyObject *Repr(PyObject *self) {
   _PyUnicodeWriter writer;
   _PyUnicodeWriter_Init(&writer);
+  writer.overallocate = 1;  // amortised growth: a chain can be long
   for (PyObject *link = self; link; link = AsWrapper(link)->next) {
     const char *name = PrettyName(AsWrapper(link)->ty);
     PyObject *text = PyUnicode_FromFormat("<Swig Object of type '%s' at %p>",
