@@ -6,9 +6,12 @@
 namespace swigrt {
 namespace detail {
 
-// The capsule this module installed as the shared table, or null when the
-// module joined a table made by a sibling (or the capsule is gone). Borrowed.
+// The capsule of the shared table, whichever module installed it, or null
+// when there is none. Borrowed.
 PyObject *TableCapsule();
+// Counts the owning wrappers that hold it (each holds one reference).
+void NoteCapsuleHeld(PyObject *capsule);
+void NoteCapsuleReleased();
 
 // Makes an object of this module's SwigPyObject type hold a reference on the
 // table capsule if it does not hold one yet (see SwigPyObject::table).

@@ -149,7 +149,10 @@ void Dealloc(PyObject *self) {
       std::fflush(stdout);
     }
   }
-  Py_XDECREF(sobj->table);
+  if (sobj->table) {
+    detail::NoteCapsuleReleased();
+    Py_DECREF(sobj->table);
+  }
   PyObject_Free(self);
   // The rest of the chain, one wrapper at a time: releasing `next` from its
   // own deallocation would recurse once per link.
@@ -311,6 +314,7 @@ void HoldTable(SwigPyObject *sobj) {
   if (!capsule) return;
   Py_INCREF(capsule);
   sobj->table = capsule;
+  detail::NoteCapsuleHeld(capsule);
 }
 
 PyObject *AppendThis(PyObject *self, PyObject *obj) {

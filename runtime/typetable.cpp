@@ -32,6 +32,10 @@ PyObject *type_cache = nullptr;
 // the capsule's destructor, so it is never left dangling.
 PyObject *table_capsule = nullptr;
 int interpreter_counter = 0;
+// The capsule this module's owning wrappers hold, whichever module installed
+// it, and how many hold it: while any does, it cannot have been destroyed.
+PyObject *held_capsule = nullptr;
+long capsule_holders = 0;
 // This module's own record, used for lookups when no capsule could be
 // found (the table then is simply not shared).
 swig_module_info *own_record = nullptr;
@@ -273,7 +277,31 @@ swig_type_info *TypeQuery(const char *type_string) {
 }
 
 namespace detail {
-PyObject *TableCapsule() { return table_capsule; }
+PyObject *TableCapsule() {
+  // While wrappers hold it, the capsule they hold is alive; otherwise it is
+  // looked up afresh in the registry, where a sibling may have put it.
+  if (capsule_holders > 0) return held_capsule;
+  if (table_capsule) return table_capsule;
+  ErrorGuard guard;
+  PyObject *found = nullptr;
+  PyObject *name = PyUnicode_FromString(kRuntimeModule);
+  PyObject *registry = name ? PyImport_GetModule(name) : nullptr;
+  Py_XDECREF(name);
+  if (registry) {
+    PyObject *capsule = PyObject_GetAttrString(registry, "type_pointer_capsule");
+    if (capsule && PyCapsule_IsValid(capsule, kCapsuleName)) found = capsule;
+    Py_XDECREF(capsule);  // the registry keeps it
+    Py_DECREF(registry);
+  }
+  return found;
+}
+
+void NoteCapsuleHeld(PyObject *capsule) {
+  held_capsule = capsule;
+  ++capsule_holders;
+}
+
+void NoteCapsuleReleased() { --capsule_holders; }
 }  // namespace detail
 
 }  // namespace swigrt

@@ -162,3 +162,17 @@ def test_each_status_test_interns_unknown_and_keeps_the_reference():
         print(sys.getrefcount('unknown') - before)
     ''')
     assert out == ['10']
+
+
+def test_a_value_either_module_made_keeps_its_destructor_until_it_goes():
+    # The shared table's entry may go first, as it does when the application
+    # finalises its interpreter; a value the second module made must still
+    # find its class's destructor (no "memory leak" line).
+    out = child('''
+        obj = vpx.VPxNode().thisVObject()
+        del sys.modules['swig_runtime_data4'].type_pointer_capsule
+        gc.collect()
+        del obj
+        print('gone')
+    ''')
+    assert out == ['gone']
