@@ -2,6 +2,8 @@
 
   python3 -m codegen outputs  MANIFEST                 files a run writes, one per line
   python3 -m codegen generate MANIFEST --include DIR --cxx-out DIR --py-out DIR
+  python3 -m codegen drive    MANIFEST --include DIR --out FILE
+                                                       a test host's call of every override
 """
 from __future__ import annotations
 
@@ -12,7 +14,8 @@ import sys
 from . import manifest as manifest_mod
 from . import model as model_mod
 from . import parse as parse_mod
-from .emit import directors, entries, header, init, proxy, table, types, variables
+from .emit import directors, drive, entries, header, init, proxy, table, types, variables
+from .model.drive import drive_calls
 
 
 def cxx_outputs(m: manifest_mod.Manifest) -> list[str]:
@@ -41,9 +44,13 @@ def render(module: model_mod.Module) -> dict[str, str]:
 
 
 def load_module(manifest_path: str, include_dirs: list[str]) -> model_mod.Module:
+    return load_with_headers(manifest_path, include_dirs)[0]
+
+
+def load_with_headers(manifest_path: str, include_dirs: list[str]):
     m = manifest_mod.load(manifest_path, os.path.relpath(manifest_path))
     headers = parse_mod.parse([c.header for c in m.classes], include_dirs, m.namespace)
-    return model_mod.build(m, headers)
+    return model_mod.build(m, headers), headers
 
 
 def _write(path: str, text: str):
@@ -69,6 +76,10 @@ def main(argv: list[str]) -> int:
     g.add_argument('--include', action='append', required=True)
     g.add_argument('--cxx-out', required=True)
     g.add_argument('--py-out', required=True)
+    d = sub.add_parser('drive')
+    d.add_argument('manifest')
+    d.add_argument('--include', action='append', required=True)
+    d.add_argument('--out', required=True)
     args = ap.parse_args(argv)
 
     if args.cmd == 'outputs':
@@ -76,10 +87,13 @@ def main(argv: list[str]) -> int:
         print('\n'.join(cxx_outputs(m)))
         return 0
     try:
-        module = load_module(args.manifest, args.include)
+        module, headers = load_with_headers(args.manifest, args.include)
     except (parse_mod.ParseError, model_mod.GeneratorError, manifest_mod.ManifestError) as e:
         print(f'codegen: {e}', file=sys.stderr)
         return 1
+    if args.cmd == 'drive':
+        _write(args.out, drive.emit(module, drive_calls(module, headers)))
+        return 0
     for name, text in render(module).items():
         _write(os.path.join(args.cxx_out, name), text)
     _write(os.path.join(args.py_out, f'{module.proxy}.py'), proxy.emit(module))

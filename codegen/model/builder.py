@@ -235,6 +235,8 @@ class Builder:
             where = f'{owner}::{fn.name}'
             args = [conversions.forward_argument(p, i + 1, directors, self.descriptor_for)
                     for i, p in enumerate(fn.params)]
+            for a, p in zip(args, fn.params):
+                a.type = p.type
             result = conversions.forward_result(fn.result, where, self.descriptor_for)
             forwards.append(Forward(fn.name, owner, args, result, fn.const,
                                     fn.access == 'protected', fn.pure, len(counts[fn.name]) > 1))

@@ -272,6 +272,7 @@ class ForwardArg:
     descriptor: Descriptor | None = None
     pointer: bool = False         # borrowed/director: the parameter is a pointer
     value_type: str = ''          # copied: the class copied
+    type: object = None           # the declared CType, for tools that call overrides
 
 
 @dataclass

@@ -11,6 +11,7 @@
 
 #include "director.h"
 #include "graph_hooks.h"
+#include "drive_calls.h"
 #include "host_calls.h"
 #include "registry_hooks.h"
 #include "swigrt.h"
@@ -484,6 +485,9 @@ PyMethodDef methods[] = {
     {"import_scene", import_scene, METH_VARARGS, "Reads a scene through a translator."},
     {"round_trip_data", round_trip_data, METH_VARARGS, "Reads, copies, writes a data type."},
     {"checked_call", checked_call, METH_VARARGS, "fn(*args), a result with an error refused."},
+    {"drive_count", drive_count, METH_NOARGS, "How many forwarding overrides there are."},
+    {"drive_info", drive_info, METH_O, "(class, method, signature) of an override."},
+    {"drive", drive_call, METH_VARARGS, "The host calls one forwarding override on an object."},
     {"string_ids", string_ids, METH_NOARGS, "Resource identifiers made and destroyed."},
     {"alive", counter<standin::aliveCount>, METH_O, "Host objects of a class alive now."},
     {"constructed", counter<standin::constructedCount>, METH_O, "Host objects constructed."},
