@@ -18,5 +18,5 @@ public:
   static int captureCount();
 
 private:
-  int fState;  // the PyGILState_STATE to restore
+  int fState;  // how the constructor found the lock, for the destructor to undo
 };
