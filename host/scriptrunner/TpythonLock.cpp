@@ -74,3 +74,5 @@ TpythonLock::~TpythonLock() {
   else if (fState >= kEnsured)
     PyGILState_Release(static_cast<PyGILState_STATE>(fState - kEnsured));
 }
+
+int TpythonLock::captureCount() { return gCaptures.load(); }
