@@ -11,13 +11,13 @@ namespace swigrt {
 // pending. Anything else is left to ConvertPtr, which gives the same answer
 // for these and handles casts, chains, ownership and None.
 inline bool DirectPointer(PyObject *obj, swig_type_info *ty, void **out) {
-  static PyTypeObject *const wrapper = SwigPyObject_type();
+  PyTypeObject *const wrapper = SwigPyObjectTypeFast();
   if (Py_TYPE(obj) != wrapper) {
     // None converts (to null) with an error still pending from a string
     // argument, so it must not reach the lookup that could replace that
     // error; any other object without "this" fails conversion anyway.
     if (!ty || obj == Py_None) return false;
-    PyObject *value = PyObject_GenericGetAttr(obj, ThisString());
+    PyObject *value = PyObject_GenericGetAttr(obj, ThisStringFast());
     if (!value) {
       PyErr_Clear();
       return false;

@@ -10,12 +10,20 @@
 
 namespace swigrt {
 
-// Every entry point is reached through this: a C++ exception that the host
-// (or the module) throws ends the call with a Python exception instead of
-// unwinding into the interpreter. A director exception has set its Python
-// error already and keeps it.
+// A C++ exception that the host (or the module) throws ends the call with a
+// Python exception instead of unwinding into the interpreter. A director
+// exception has set its Python error already and keeps it. Called inside a
+// handler.
 void SetErrorFromException() noexcept;
 
+// The result of a generated entry point's function try block.
+inline PyObject *ExceptionResult() noexcept {
+  SetErrorFromException();
+  return nullptr;
+}
+
+// The same for a function written by hand, which the method table reaches
+// through this.
 template <PyCFunction entry>
 PyObject *Safe(PyObject *self, PyObject *args) noexcept {
   try {

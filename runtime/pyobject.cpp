@@ -202,6 +202,7 @@ PyTypeObject *BuildWrapperType() {
 
 PyTypeObject *SwigPyObject_type() {
   static PyTypeObject *const type = BuildWrapperType();
+  detail::wrapper_type = type;
   return type;
 }
 
@@ -230,6 +231,7 @@ PyObject *SwigPyObject_New(void *ptr, swig_type_info *ty, int own) {
 
 namespace detail {
 
+PyTypeObject *wrapper_type = nullptr;
 int call_depth = 0;
 bool have_kept = false;
 std::vector<PyObject *> kept;

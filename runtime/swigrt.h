@@ -155,9 +155,20 @@ inline int SWIG_ArgError(int r) { return r != SWIG_ERROR ? r : SWIG_TypeError; }
 namespace swigrt {
 
 // --- start-up -------------------------------------------------------------
+namespace detail {
+extern PyObject *this_string;        // what ThisString() made, or null
+extern PyTypeObject *wrapper_type;   // what SwigPyObject_type() made, or null
+}
 PyObject *ThisString();                 // interned "this", made once (borrowed)
+// The same, read without a call where the module has started.
+inline PyObject *ThisStringFast() {
+  return detail::this_string ? detail::this_string : ThisString();
+}
 PyObject *TypeCache();                  // the type_cache dictionary, made once (borrowed)
 PyTypeObject *SwigPyObject_type();      // null if readying failed
+inline PyTypeObject *SwigPyObjectTypeFast() {
+  return detail::wrapper_type ? detail::wrapper_type : SwigPyObject_type();
+}
 PyTypeObject *SwigPyPacked_type();
 void FixMethods(PyMethodDef *methods, const swig_const_info *const_table,
                 swig_type_info **types, swig_type_info **types_initial);

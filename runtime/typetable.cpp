@@ -26,7 +26,6 @@ namespace {
 constexpr char kRuntimeModule[] = "swig_runtime_data4";
 constexpr char kCapsuleName[] = "swig_runtime_data4.type_pointer_capsule";
 
-PyObject *this_string = nullptr;
 PyObject *type_cache = nullptr;
 // Borrowed: the registry module's dictionary owns the capsule. Cleared by
 // the capsule's destructor, so it is never left dangling.
@@ -74,7 +73,7 @@ void DestroyCapsule(PyObject *capsule) {
     ty->owndata = 0;
     if (data) detail::DeleteClientData(data);
   }
-  Py_CLEAR(this_string);
+  Py_CLEAR(detail::this_string);
   detail::ReleaseGlobals();
   Py_CLEAR(type_cache);
 }
@@ -168,8 +167,8 @@ void LinkCast(swig_type_info *target, swig_cast_info *cast) {
 }  // namespace
 
 PyObject *ThisString() {
-  if (!this_string) this_string = PyUnicode_InternFromString("this");
-  return this_string;
+  if (!detail::this_string) detail::this_string = PyUnicode_InternFromString("this");
+  return detail::this_string;
 }
 
 PyObject *TypeCache() {
@@ -277,6 +276,8 @@ swig_type_info *TypeQuery(const char *type_string) {
 }
 
 namespace detail {
+PyObject *this_string = nullptr;
+
 PyObject *TableCapsule() {
   // While wrappers hold it, the capsule they hold is alive; otherwise it is
   // looked up afresh in the registry, where a sibling may have put it.

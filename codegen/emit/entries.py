@@ -8,11 +8,18 @@ from ..model import (METH_NOARGS, METH_O, REFUSE_PLAIN, Arg, Candidate, Dispatch
                      Module, PointerClass, WrappedClass)
 
 
-def _open(function: str, param: str) -> str:
-    """The head of an entry point. Its call scope keeps alive, until the call
-    is over, any "this" that a pointer conversion had to make."""
-    return (f'PyObject *{function}(PyObject *, PyObject *{param}) {{\n'
-            '  swigrt::CallScope scope;\n')
+def _open(function: str, param: str, scope: bool = True) -> str:
+    """The head of an entry point, a function try block (see _CLOSE). Its call
+    scope keeps alive, until the call is over, any "this" that a pointer
+    conversion had to make."""
+    return (f'PyObject *{function}(PyObject *, PyObject *{param}) try {{\n'
+            + ('  swigrt::CallScope scope;\n' if scope else ''))
+
+
+# The end of every entry point: a C++ exception becomes a Python one rather
+# than unwinding into the interpreter.
+_CLOSE = '} catch (...) {\n  return swigrt::ExceptionResult();\n}\n'
+
 
 
 def _slot(a: Arg) -> str:
@@ -256,7 +263,7 @@ def _comparison(cls: str, ep: EntryPoint) -> str:
             f'  if (!SWIG_IsOK(swigrt::ConvertPtr(argv[1], &argp2, {other.descriptor.macro}, 0)) || '
             '!argp2)\n    Py_RETURN_NOTIMPLEMENTED;\n'
             f'  return PyBool_FromLong(*static_cast<{cls} *>(argp1) {op} '
-            f'*static_cast<{cls} *>(argp2));\n}}\n')
+            f'*static_cast<{cls} *>(argp2));\n' + _CLOSE)
 
 
 def entry_point(cls: str, ep: EntryPoint) -> str:
@@ -264,19 +271,19 @@ def entry_point(cls: str, ep: EntryPoint) -> str:
         return _comparison(cls, ep)
 
     def head(param: str) -> str:
-        return _open(ep.function, param)
+        return _open(ep.function, param, ep.converts_objects)
 
     if not ep.dispatch:
         c = ep.candidates[0]
         if ep.flags == METH_O:
             reads = ep.takes_self or any(a.slot is not None for a in c.args)
             argv = '  PyObject *argv[1] = {arg};\n' if reads else ''
-            return head('arg') + '  if (!arg) return nullptr;\n' + argv + _body(cls, ep, c) + '}\n'
+            return head('arg') + '  if (!arg) return nullptr;\n' + argv + _body(cls, ep, c) + _CLOSE
         if ep.flags == METH_NOARGS:
-            return head('') + _body(cls, ep, c) + '}\n'
+            return head('') + _body(cls, ep, c) + _CLOSE
         return (head('args') + f'  PyObject *argv[{max(c.max_args, 1)}] = {{}};\n'
                 f'  if (!swigrt::UnpackTuple(args, {c_string(ep.entry)}, {c.min_args}, '
-                f'{c.max_args}, argv)) return nullptr;\n' + _body(cls, ep, c) + '}\n')
+                f'{c.max_args}, argv)) return nullptr;\n' + _body(cls, ep, c) + _CLOSE)
     out = []
     for c in ep.candidates:
         count = (f'argc != {c.min_args}' if c.min_args == c.max_args
@@ -293,7 +300,7 @@ def entry_point(cls: str, ep: EntryPoint) -> str:
                f'  {branches}\n'
                '  if (!swigrt::DispatchFailed(result)) return result;\n'
                f'  swigrt::RaiseOrModifyTypeError({c_string(ep.message)});\n'
-               '  return nullptr;\n}\n')
+               '  return nullptr;\n' + _CLOSE)
     return ''.join(out)
 
 
@@ -308,7 +315,7 @@ def _class(cls: WrappedClass) -> str:
                '  // The wrapper stops pointing at the object: a later use is refused.\n'
                f'  if (!swigrt::PointerArg(arg, {d}, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, '
                f'&argp1, {msg})) return nullptr;\n'
-               f'  delete static_cast<{cls.name} *>(argp1);\n  Py_RETURN_NONE;\n}}\n\n')
+               f'  delete static_cast<{cls.name} *>(argp1);\n  Py_RETURN_NONE;\n' + _CLOSE + '\n')
     out += [entry_point(cls.name, m) + '\n' for m in cls.members if m.candidates]
     if cls.director:
         msg = c_string(f"in method 'disown_{cls.name}', argument 1 of type '{cls.name} *'")
@@ -319,7 +326,7 @@ def _class(cls: WrappedClass) -> str:
                    '  // Python instance until the host deletes it.\n'
                    f'  auto *director = dynamic_cast<Swig::Director *>(static_cast<{cls.name} *>(argp1));\n'
                    '  if (director) director->swig_disown();\n'
-                   '  Py_RETURN_NONE;\n}\n\n')
+                   '  Py_RETURN_NONE;\n' + _CLOSE + '\n')
     out.append(f'PyObject *wrap_{cls.name}_swigregister(PyObject *, PyObject *args) {{\n'
                f'  return swigrt::RegisterClass(args, {d});\n}}\n\n')
     return ''.join(out)
@@ -336,7 +343,7 @@ def _pointer_class(p: PointerClass) -> str:
 
     def one(what: str, body: str) -> str:
         return (_open(f'wrap_{p.entry(what)}', 'arg') +
-                '  if (!arg) return nullptr;\n  PyObject *argv[1] = {arg};\n' + body + '}\n\n')
+                '  if (!arg) return nullptr;\n  PyObject *argv[1] = {arg};\n' + body + _CLOSE + '\n')
 
     value = {'PyLong_FromLong': 'PyLong_FromLong(static_cast<long>(*cell))'}.get(
         p.result, f'{p.result}(*cell)')
@@ -352,7 +359,7 @@ def _pointer_class(p: PointerClass) -> str:
            '  if (!arg) return nullptr;\n  void *argp1 = nullptr;\n'
            f'  if (!swigrt::PointerArg(arg, {own}, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, '
            f'&argp1, {c_string(delete_msg)})) return nullptr;\n'
-           f'  delete static_cast<{t} *>(argp1);\n  Py_RETURN_NONE;\n}}\n\n',
+           f'  delete static_cast<{t} *>(argp1);\n  Py_RETURN_NONE;\n' + _CLOSE + '\n',
            _open(f'wrap_{p.entry("assign")}', 'args') +
            '  PyObject *argv[2] = {};\n'
            f'  if (!swigrt::UnpackTuple(args, {c_string(p.entry("assign"))}, 2, 2, argv)) '
@@ -360,7 +367,7 @@ def _pointer_class(p: PointerClass) -> str:
            f'  {t} value;\n'
            f'  if (!swigrt::ScalarArg(swigrt::{p.converter}(argv[1], &value), '
            f'{c_string(assign_msg)})) return nullptr;\n'
-           '  *cell = value;\n  Py_RETURN_NONE;\n}\n\n',
+           '  *cell = value;\n  Py_RETURN_NONE;\n' + _CLOSE + '\n',
            one('value', self_arg(p.entry('value')) + f'  return {value};\n')]
     if t == 'char':
         # The cell read as a C string, and a pointer made from a text argument.

@@ -2,18 +2,21 @@
 from __future__ import annotations
 
 from .common import banner, c_string, namespace_close, namespace_open
-from ..model import Module, METH_NOARGS, METH_O, METH_VARARGS
+from ..model import Module, MethodEntry, METH_NOARGS, METH_O, METH_VARARGS
 
 _FLAGS = {METH_VARARGS: 'METH_VARARGS', METH_NOARGS: 'METH_NOARGS', METH_O: 'METH_O'}
 
 
-def _guarded(function: str) -> str:
-    return function if function.startswith('swigrt::') else f'swigrt::Safe<{function}>'
+def _function(e: MethodEntry) -> str:
+    if e.catches or e.function.startswith('swigrt::'):
+        return e.function
+    return f'swigrt::Safe<{e.function}>'
 
 
 def emit(module: Module) -> str:
-    # Every generated or hand-written entry point runs inside swigrt::Safe.
-    rows = ''.join(f'    {{{c_string(e.name)}, {_guarded(e.function)}, {_FLAGS[e.flags]}, nullptr}},\n'
+    # No C++ exception leaves an entry: generated ones catch it, the table
+    # wraps the others in swigrt::Safe.
+    rows = ''.join(f'    {{{c_string(e.name)}, {_function(e)}, {_FLAGS[e.flags]}, nullptr}},\n'
                    for e in module.entries)
     end = '    {nullptr, nullptr, 0, nullptr},\n'
     return ''.join([

@@ -338,16 +338,18 @@ class Builder:
             for what, flags in (('new', METH_VARARGS), ('delete', METH_O), ('assign', METH_VARARGS),
                                 ('value', METH_O), ('cast', METH_O), ('frompointer', METH_O),
                                 ('swigregister', METH_O)):
-                entries.append(MethodEntry(p.entry(what), f'wrap_{p.entry(what)}', flags))
+                entries.append(MethodEntry(p.entry(what), f'wrap_{p.entry(what)}', flags,
+                                           what not in ('new', 'swigregister')))
             entries.append(MethodEntry(p.entry('swiginit'), 'swigrt::ShadowInit', METH_VARARGS))
         functions = [MethodEntry(name, f'wrap_{name}', METH_NOARGS) for name in self.m.functions]
         entries += functions
         for c in classes:
             if c.constructor:
                 entries.append(MethodEntry(c.constructor.entry, c.constructor.function,
-                                           c.constructor.flags))
-            entries.append(MethodEntry(c.delete_entry, f'wrap_{c.delete_entry}', METH_O))
-            entries += [MethodEntry(m.entry, m.function, m.flags) for m in c.members]
+                                           c.constructor.flags, True))
+            entries.append(MethodEntry(c.delete_entry, f'wrap_{c.delete_entry}', METH_O, True))
+            entries += [MethodEntry(m.entry, m.function, m.flags, bool(m.candidates))
+                        for m in c.members]
             # A writable static variable is also reached through its own pair of
             # functions, on which the proxy class builds a class property; a
             # read-only one only through cvar.
@@ -356,7 +358,8 @@ class Builder:
                     entries.append(MethodEntry(f'{v.name}_get', f'wrap_{v.name}_get', METH_VARARGS))
                     entries.append(MethodEntry(f'{v.name}_set', f'wrap_{v.name}_set', METH_O))
             if c.director:
-                entries.append(MethodEntry(f'disown_{c.name}', f'wrap_disown_{c.name}', METH_O))
+                entries.append(MethodEntry(f'disown_{c.name}', f'wrap_disown_{c.name}', METH_O,
+                                           True))
             entries.append(MethodEntry(f'{c.name}_swigregister', f'wrap_{c.name}_swigregister',
                                        METH_O))
             entries.append(MethodEntry(f'{c.name}_swiginit', 'swigrt::ShadowInit', METH_VARARGS))

@@ -120,6 +120,13 @@ class EntryPoint:
     field: str = ''               # data member accessors: the member's name
     accessor: str = ''            # 'get' or 'set' for a data member accessor
 
+    @property
+    def converts_objects(self) -> bool:
+        """Whether a candidate converts a wrapped object (self included), whose
+        "this" a call scope may have to keep alive until the call is over."""
+        return any(a.kind == 'object' for c in self.candidates for a in c.args) or \
+            self.takes_self or self.comparison
+
 
 @dataclass
 class Constant:
@@ -188,6 +195,9 @@ class MethodEntry:
     name: str
     function: str
     flags: int
+    # Generated functions catch C++ exceptions themselves; the method table
+    # wraps the others (hand-written ones among them) in swigrt::Safe.
+    catches: bool = False
 
 
 @dataclass

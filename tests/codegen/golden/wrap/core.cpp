@@ -6,16 +6,18 @@ namespace Fixture_wrap {
 
 // Node
 
-PyObject *wrap_new_Node(PyObject *, PyObject *arg) {
+PyObject *wrap_new_Node(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   Node *object = argv[0] != Py_None ? new SwigDirector_Node(argv[0]) : new Node();
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Node, SWIG_POINTER_NEW);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_delete_Node(PyObject *, PyObject *arg) {
+PyObject *wrap_delete_Node(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -23,9 +25,11 @@ PyObject *wrap_delete_Node(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Node, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Node', argument 1 of type 'Node *'")) return nullptr;
   delete static_cast<Node *>(argp1);
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Node_count(PyObject *, PyObject *arg) {
+PyObject *wrap_Node_count(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
@@ -34,9 +38,11 @@ PyObject *wrap_Node_count(PyObject *, PyObject *arg) {
   PyObject *resultobj = PyLong_FromLong(static_cast<long>(static_cast<Node *>(argp1)->count()));
   if (!resultobj) return nullptr;
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Node_setCount(PyObject *, PyObject *args) {
+PyObject *wrap_Node_setCount(PyObject *, PyObject *args) try {
   swigrt::CallScope scope;
   PyObject *argv[3] = {};
   if (!swigrt::UnpackTuple(args, "Node_setCount", 2, 3, argv)) return nullptr;
@@ -49,10 +55,11 @@ PyObject *wrap_Node_setCount(PyObject *, PyObject *args) {
   static_cast<Node *>(argp1)->setCount(arg2, arg3);
   PyObject *resultobj = Py_NewRef(Py_None);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Node_make(PyObject *, PyObject *args) {
-  swigrt::CallScope scope;
+PyObject *wrap_Node_make(PyObject *, PyObject *args) try {
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Node_make", 1, 2, argv)) return nullptr;
   swigrt::CharsArg arg1;
@@ -62,9 +69,11 @@ PyObject *wrap_Node_make(PyObject *, PyObject *args) {
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Value(Node::make(arg1.ptr, static_cast<Node::Kind>(arg2))), SWIGTYPE_p_Value, SWIG_POINTER_OWN);
   if (!resultobj) return nullptr;
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Node_parent(PyObject *, PyObject *arg) {
+PyObject *wrap_Node_parent(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
@@ -73,9 +82,11 @@ PyObject *wrap_Node_parent(PyObject *, PyObject *arg) {
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Node *>(static_cast<Node *>(argp1)->parent()), SWIGTYPE_p_Node, 0);
   if (!resultobj) return nullptr;
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Node_value(PyObject *, PyObject *arg) {
+PyObject *wrap_Node_value(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
@@ -84,9 +95,11 @@ PyObject *wrap_Node_value(PyObject *, PyObject *arg) {
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Value *>(&static_cast<Node *>(argp1)->value()), SWIGTYPE_p_Value, 0);
   if (!resultobj) return nullptr;
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Node_rename(PyObject *, PyObject *args) {
+PyObject *wrap_Node_rename(PyObject *, PyObject *args) try {
   swigrt::CallScope scope;
   PyObject *argv[3] = {};
   if (!swigrt::UnpackTuple(args, "Node_rename", 3, 3, argv)) return nullptr;
@@ -105,9 +118,11 @@ PyObject *wrap_Node_rename(PyObject *, PyObject *args) {
     return nullptr;
   }
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Node_names(PyObject *, PyObject *args) {
+PyObject *wrap_Node_names(PyObject *, PyObject *args) try {
   swigrt::CallScope scope;
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Node_names", 1, 2, argv)) return nullptr;
@@ -124,6 +139,8 @@ PyObject *wrap_Node_names(PyObject *, PyObject *args) {
     return nullptr;
   }
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
 static PyObject *wrap_Node_pick_1(Py_ssize_t argc, PyObject **argv) {
@@ -150,7 +167,7 @@ static PyObject *wrap_Node_pick_2(Py_ssize_t argc, PyObject **argv) {
   return resultobj;
 }
 
-PyObject *wrap_Node_pick(PyObject *, PyObject *args) {
+PyObject *wrap_Node_pick(PyObject *, PyObject *args) try {
   swigrt::CallScope scope;
   PyObject *argv[3] = {};
   Py_ssize_t argc = swigrt::UnpackTuple(args, "Node_pick", 0, 3, argv) - 1;
@@ -163,9 +180,11 @@ PyObject *wrap_Node_pick(PyObject *, PyObject *args) {
   if (!swigrt::DispatchFailed(result)) return result;
   swigrt::RaiseOrModifyTypeError("Wrong number or type of arguments for overloaded function 'Node_pick'.\n  Possible C/C++ prototypes are:\n    Node::pick(int)\n    Node::pick(Value const &,int)\n");
   return nullptr;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_disown_Node(PyObject *, PyObject *arg) {
+PyObject *wrap_disown_Node(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -175,6 +194,8 @@ PyObject *wrap_disown_Node(PyObject *, PyObject *arg) {
   auto *director = dynamic_cast<Swig::Director *>(static_cast<Node *>(argp1));
   if (director) director->swig_disown();
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
 PyObject *wrap_Node_swigregister(PyObject *, PyObject *args) {
@@ -183,16 +204,18 @@ PyObject *wrap_Node_swigregister(PyObject *, PyObject *args) {
 
 // Shape
 
-PyObject *wrap_new_Shape(PyObject *, PyObject *arg) {
+PyObject *wrap_new_Shape(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   Shape *object = argv[0] != Py_None ? new SwigDirector_Shape(argv[0]) : new Shape();
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Shape, SWIG_POINTER_NEW);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_delete_Shape(PyObject *, PyObject *arg) {
+PyObject *wrap_delete_Shape(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -200,9 +223,11 @@ PyObject *wrap_delete_Shape(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Shape, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Shape', argument 1 of type 'Shape *'")) return nullptr;
   delete static_cast<Shape *>(argp1);
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_disown_Shape(PyObject *, PyObject *arg) {
+PyObject *wrap_disown_Shape(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -212,6 +237,8 @@ PyObject *wrap_disown_Shape(PyObject *, PyObject *arg) {
   auto *director = dynamic_cast<Swig::Director *>(static_cast<Shape *>(argp1));
   if (director) director->swig_disown();
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
 PyObject *wrap_Shape_swigregister(PyObject *, PyObject *args) {
@@ -220,7 +247,7 @@ PyObject *wrap_Shape_swigregister(PyObject *, PyObject *args) {
 
 // Abstract
 
-PyObject *wrap_new_Abstract(PyObject *, PyObject *arg) {
+PyObject *wrap_new_Abstract(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
@@ -231,9 +258,11 @@ PyObject *wrap_new_Abstract(PyObject *, PyObject *arg) {
   Abstract *object = new SwigDirector_Abstract(argv[0]);
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Abstract, SWIG_POINTER_NEW);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_delete_Abstract(PyObject *, PyObject *arg) {
+PyObject *wrap_delete_Abstract(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -241,9 +270,11 @@ PyObject *wrap_delete_Abstract(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Abstract, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Abstract', argument 1 of type 'Abstract *'")) return nullptr;
   delete static_cast<Abstract *>(argp1);
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Abstract_name(PyObject *, PyObject *arg) {
+PyObject *wrap_Abstract_name(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
@@ -260,9 +291,11 @@ PyObject *wrap_Abstract_name(PyObject *, PyObject *arg) {
     return nullptr;
   }
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_disown_Abstract(PyObject *, PyObject *arg) {
+PyObject *wrap_disown_Abstract(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -272,6 +305,8 @@ PyObject *wrap_disown_Abstract(PyObject *, PyObject *arg) {
   auto *director = dynamic_cast<Swig::Director *>(static_cast<Abstract *>(argp1));
   if (director) director->swig_disown();
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
 PyObject *wrap_Abstract_swigregister(PyObject *, PyObject *args) {
@@ -280,7 +315,7 @@ PyObject *wrap_Abstract_swigregister(PyObject *, PyObject *args) {
 
 // Hidden
 
-PyObject *wrap_new_Hidden(PyObject *, PyObject *arg) {
+PyObject *wrap_new_Hidden(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
@@ -291,9 +326,11 @@ PyObject *wrap_new_Hidden(PyObject *, PyObject *arg) {
   Hidden *object = new SwigDirector_Hidden(argv[0]);
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Hidden, SWIG_POINTER_NEW);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_delete_Hidden(PyObject *, PyObject *arg) {
+PyObject *wrap_delete_Hidden(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -301,9 +338,11 @@ PyObject *wrap_delete_Hidden(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Hidden, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Hidden', argument 1 of type 'Hidden *'")) return nullptr;
   delete static_cast<Hidden *>(argp1);
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_disown_Hidden(PyObject *, PyObject *arg) {
+PyObject *wrap_disown_Hidden(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -313,6 +352,8 @@ PyObject *wrap_disown_Hidden(PyObject *, PyObject *arg) {
   auto *director = dynamic_cast<Swig::Director *>(static_cast<Hidden *>(argp1));
   if (director) director->swig_disown();
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
 PyObject *wrap_Hidden_swigregister(PyObject *, PyObject *args) {
@@ -354,7 +395,7 @@ static PyObject *wrap_new_Pair_3(Py_ssize_t argc, PyObject **argv) {
   return resultobj;
 }
 
-PyObject *wrap_new_Pair(PyObject *, PyObject *args) {
+PyObject *wrap_new_Pair(PyObject *, PyObject *args) try {
   swigrt::CallScope scope;
   PyObject *argv[4] = {};
   Py_ssize_t argc = swigrt::UnpackTuple(args, "new_Pair", 0, 4, argv) - 1;
@@ -369,9 +410,11 @@ PyObject *wrap_new_Pair(PyObject *, PyObject *args) {
   if (!swigrt::DispatchFailed(result)) return result;
   swigrt::RaiseOrModifyTypeError("Wrong number or type of arguments for overloaded function 'new_Pair'.\n  Possible C/C++ prototypes are:\n    Pair::Pair(PyObject *,Value &)\n    Pair::Pair(PyObject *,Value &,Node const &)\n    Pair::Pair(PyObject *,Node *,Value &,Value &)\n");
   return nullptr;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_delete_Pair(PyObject *, PyObject *arg) {
+PyObject *wrap_delete_Pair(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -379,9 +422,11 @@ PyObject *wrap_delete_Pair(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pair, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Pair', argument 1 of type 'Pair *'")) return nullptr;
   delete static_cast<Pair *>(argp1);
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_disown_Pair(PyObject *, PyObject *arg) {
+PyObject *wrap_disown_Pair(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -391,6 +436,8 @@ PyObject *wrap_disown_Pair(PyObject *, PyObject *arg) {
   auto *director = dynamic_cast<Swig::Director *>(static_cast<Pair *>(argp1));
   if (director) director->swig_disown();
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
 PyObject *wrap_Pair_swigregister(PyObject *, PyObject *args) {
@@ -413,7 +460,7 @@ static PyObject *wrap_new_Value_2(Py_ssize_t argc, PyObject **argv) {
   return resultobj;
 }
 
-PyObject *wrap_new_Value(PyObject *, PyObject *args) {
+PyObject *wrap_new_Value(PyObject *, PyObject *args) try {
   swigrt::CallScope scope;
   PyObject *argv[1] = {};
   Py_ssize_t argc = swigrt::UnpackTuple(args, "new_Value", 0, 1, argv) - 1;
@@ -426,9 +473,11 @@ PyObject *wrap_new_Value(PyObject *, PyObject *args) {
   if (!swigrt::DispatchFailed(result)) return result;
   swigrt::RaiseOrModifyTypeError("Wrong number or type of arguments for overloaded function 'new_Value'.\n  Possible C/C++ prototypes are:\n    Value::Value()\n    Value::Value(Value const &)\n");
   return nullptr;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_delete_Value(PyObject *, PyObject *arg) {
+PyObject *wrap_delete_Value(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -436,6 +485,8 @@ PyObject *wrap_delete_Value(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Value, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Value', argument 1 of type 'Value *'")) return nullptr;
   delete static_cast<Value *>(argp1);
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
 PyObject *wrap_Value_swigregister(PyObject *, PyObject *args) {
@@ -444,13 +495,14 @@ PyObject *wrap_Value_swigregister(PyObject *, PyObject *args) {
 
 // Pod
 
-PyObject *wrap_new_Pod(PyObject *, PyObject *) {
-  swigrt::CallScope scope;
+PyObject *wrap_new_Pod(PyObject *, PyObject *) try {
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pod(), SWIGTYPE_p_Pod, SWIG_POINTER_NEW);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_delete_Pod(PyObject *, PyObject *arg) {
+PyObject *wrap_delete_Pod(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -458,9 +510,11 @@ PyObject *wrap_delete_Pod(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Pod, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Pod', argument 1 of type 'Pod *'")) return nullptr;
   delete static_cast<Pod *>(argp1);
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pod_count_set(PyObject *, PyObject *args) {
+PyObject *wrap_Pod_count_set(PyObject *, PyObject *args) try {
   swigrt::CallScope scope;
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Pod_count_set", 2, 2, argv)) return nullptr;
@@ -471,9 +525,11 @@ PyObject *wrap_Pod_count_set(PyObject *, PyObject *args) {
   static_cast<Pod *>(argp1)->count = arg2;
   PyObject *resultobj = Py_NewRef(Py_None);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pod_count_get(PyObject *, PyObject *arg) {
+PyObject *wrap_Pod_count_get(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
@@ -482,9 +538,11 @@ PyObject *wrap_Pod_count_get(PyObject *, PyObject *arg) {
   PyObject *resultobj = PyLong_FromLong(static_cast<long>(static_cast<Pod *>(argp1)->count));
   if (!resultobj) return nullptr;
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pod_value_set(PyObject *, PyObject *args) {
+PyObject *wrap_Pod_value_set(PyObject *, PyObject *args) try {
   swigrt::CallScope scope;
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Pod_value_set", 2, 2, argv)) return nullptr;
@@ -495,9 +553,11 @@ PyObject *wrap_Pod_value_set(PyObject *, PyObject *args) {
   static_cast<Pod *>(argp1)->value = *static_cast<Value *>(argp2);
   PyObject *resultobj = Py_NewRef(Py_None);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pod_value_get(PyObject *, PyObject *arg) {
+PyObject *wrap_Pod_value_get(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
@@ -506,9 +566,11 @@ PyObject *wrap_Pod_value_get(PyObject *, PyObject *arg) {
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Value *>(&static_cast<Pod *>(argp1)->value), SWIGTYPE_p_Value, 0);
   if (!resultobj) return nullptr;
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pod_owner_set(PyObject *, PyObject *args) {
+PyObject *wrap_Pod_owner_set(PyObject *, PyObject *args) try {
   swigrt::CallScope scope;
   PyObject *argv[2] = {};
   if (!swigrt::UnpackTuple(args, "Pod_owner_set", 2, 2, argv)) return nullptr;
@@ -519,9 +581,11 @@ PyObject *wrap_Pod_owner_set(PyObject *, PyObject *args) {
   static_cast<Pod *>(argp1)->owner = static_cast<Node *>(argp2);
   PyObject *resultobj = Py_NewRef(Py_None);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pod_owner_get(PyObject *, PyObject *arg) {
+PyObject *wrap_Pod_owner_get(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
@@ -530,6 +594,8 @@ PyObject *wrap_Pod_owner_get(PyObject *, PyObject *arg) {
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Node *>(static_cast<Pod *>(argp1)->owner), SWIGTYPE_p_Node, 0);
   if (!resultobj) return nullptr;
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
 PyObject *wrap_Pod_swigregister(PyObject *, PyObject *args) {

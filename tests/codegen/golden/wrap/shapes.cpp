@@ -6,16 +6,18 @@ namespace Fixture_wrap {
 
 // Mesh
 
-PyObject *wrap_new_Mesh(PyObject *, PyObject *arg) {
+PyObject *wrap_new_Mesh(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   PyObject *argv[1] = {arg};
   Mesh *object = argv[0] != Py_None ? new SwigDirector_Mesh(argv[0]) : new Mesh();
   PyObject *resultobj = swigrt::NewPointerObj(nullptr, object, SWIGTYPE_p_Mesh, SWIG_POINTER_NEW);
   return resultobj;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_delete_Mesh(PyObject *, PyObject *arg) {
+PyObject *wrap_delete_Mesh(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -23,9 +25,11 @@ PyObject *wrap_delete_Mesh(PyObject *, PyObject *arg) {
   if (!swigrt::PointerArg(arg, SWIGTYPE_p_Mesh, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, &argp1, "in method 'delete_Mesh', argument 1 of type 'Mesh *'")) return nullptr;
   delete static_cast<Mesh *>(argp1);
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_disown_Mesh(PyObject *, PyObject *arg) {
+PyObject *wrap_disown_Mesh(PyObject *, PyObject *arg) try {
   swigrt::CallScope scope;
   if (!arg) return nullptr;
   void *argp1 = nullptr;
@@ -35,6 +39,8 @@ PyObject *wrap_disown_Mesh(PyObject *, PyObject *arg) {
   auto *director = dynamic_cast<Swig::Director *>(static_cast<Mesh *>(argp1));
   if (director) director->swig_disown();
   Py_RETURN_NONE;
+} catch (...) {
+  return swigrt::ExceptionResult();
 }
 
 PyObject *wrap_Mesh_swigregister(PyObject *, PyObject *args) {
