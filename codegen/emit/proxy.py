@@ -9,11 +9,13 @@ _PRELUDE = '''
 import weakref
 
 from . import {ext} as _ext
+from . import _methods
 {imports}
-# Members are the module's built-ins themselves, bound as methods: a call
-# reaches the entry point without a Python frame in between.
-_instance_method = _ext.SWIG_PyInstanceMethod_New
-_static_method = _ext.SWIG_PyStaticMethod_New
+# Members are the module's built-ins themselves, bound as method descriptors:
+# a call through an instance reaches the entry point with the instance in
+# place, with no Python frame and no bound method in between. A static member
+# is the built-in as it is, which no attribute access binds.
+_instance_method = _methods.method
 
 
 def _thisown_get(self):
@@ -80,8 +82,10 @@ def _class(cls: WrappedClass) -> str:
             if m.accessor == 'get':
                 out.append(f'    {m.field} = property(_ext.{m.entry}, _ext.{m.entry[:-4]}_set)\n')
             continue
-        wrap = '_static_method' if m.static else '_instance_method'
-        out.append(f'    {m.member} = {wrap}(_ext.{m.entry})\n')
+        if m.static:
+            out.append(f'    {m.member} = _ext.{m.entry}\n')
+        else:
+            out.append(f'    {m.member} = _instance_method(_ext.{m.entry})\n')
     if cls.director:
         out.append('\n    def __disown__(self):\n'
                    '        self.this.disown()\n'
@@ -108,7 +112,7 @@ def _pointer_class(p: PointerClass) -> str:
             f'    assign = _instance_method(_ext.{n}_assign)\n'
             f'    value = _instance_method(_ext.{n}_value)\n'
             f'    cast = _instance_method(_ext.{n}_cast)\n'
-            f'    frompointer = _static_method(_ext.{n}_frompointer)\n\n\n'
+            f'    frompointer = _ext.{n}_frompointer\n\n\n'
             f'_ext.{n}_swigregister({n})\n')
 
 

@@ -5,12 +5,14 @@
 import weakref
 
 from . import _Fixture as _ext
+from . import _methods
 from . import Other
 
-# Members are the module's built-ins themselves, bound as methods: a call
-# reaches the entry point without a Python frame in between.
-_instance_method = _ext.SWIG_PyInstanceMethod_New
-_static_method = _ext.SWIG_PyStaticMethod_New
+# Members are the module's built-ins themselves, bound as method descriptors:
+# a call through an instance reaches the entry point with the instance in
+# place, with no Python frame and no bound method in between. A static member
+# is the built-in as it is, which no attribute access binds.
+_instance_method = _methods.method
 
 
 def _thisown_get(self):
@@ -62,7 +64,7 @@ class Node(object):
 
     count = _instance_method(_ext.Node_count)
     setCount = _instance_method(_ext.Node_setCount)
-    make = _static_method(_ext.Node_make)
+    make = _ext.Node_make
     parent = _instance_method(_ext.Node_parent)
     value = _instance_method(_ext.Node_value)
     rename = _instance_method(_ext.Node_rename)
