@@ -60,6 +60,7 @@ bench: build
 	cmake -S . -B $(BUILD)
 	cmake --build $(BUILD) --target bench-modules
 	$(PYTHON) bench/bench_calls.py --build $(BUILD)
+	$(PYTHON) bench/bench_app.py --build $(BUILD)
 
 clean:
 	rm -rf $(BUILD) $(ASAN_BUILD)

@@ -6,6 +6,7 @@
 #include <standin/Registry.h>
 
 #include <cctype>
+#include <set>
 #include <utility>
 
 #include "GraphModel.h"
@@ -53,12 +54,18 @@ void Node::bind(const std::shared_ptr<Node> &self) {
     slots.push_back(std::move(slot));
   }
   computing.assign(slots.size(), 0);
+  walked.assign(slots.size(), 0);
 }
 
 NodePtr GraphState::findNode(const std::string &name) const {
-  for (const NodePtr &n : nodes)
-    if (n->name == name) return n;
-  return nullptr;
+  auto it = byName.find(name);
+  return it == byName.end() ? nullptr : it->second;
+}
+
+void GraphState::addNode(const NodePtr &node) {
+  node->serial = ++madeNodes;
+  nodes.emplace(node->serial, node);
+  byName.emplace(node->name, node);
 }
 
 VStatus GraphState::parsePlug(const std::string &plug, NodePtr *node, int *attribute) const {
@@ -145,6 +152,14 @@ std::shared_ptr<const NodeType> GraphState::nodeType(const std::string &typeName
     type->attributes[from].affects.push_back(to);
     type->attributes[to].computed = true;
   }
+  for (const RegistrationInfo &r : standin::registrations())
+    if (r.name == typeName && (r.kind == "Node" || r.kind == "Shape" || r.kind == "Transform"))
+      for (const RegisteredCallback &c : r.callbacks)
+        if (c.role == "creator" && c.script) type->scripted = true;
+  type->affectedBy.assign(type->attributes.size(), {});
+  for (size_t from = 0; from < type->attributes.size(); ++from)
+    for (int to : type->attributes[from].affects)
+      type->affectedBy[to].push_back(static_cast<int>(from));
   std::lock_guard<std::mutex> guard(mutex);
   types[typeName] = type;
   return type;
@@ -152,27 +167,27 @@ std::shared_ptr<const NodeType> GraphState::nodeType(const std::string &typeName
 
 NodePtr GraphState::remove(const std::string &name, VStatus *status) {
   std::lock_guard<std::mutex> guard(mutex);
-  for (auto it = nodes.begin(); it != nodes.end(); ++it) {
-    if ((*it)->name != name) continue;
-    NodePtr node = std::move(*it);
-    nodes.erase(it);
-    // Downstream values stay as they were last taken, and clean.
-    for (auto c = connections.begin(); c != connections.end();) {
-      if (c->source != node.get() && c->destination != node.get()) {
-        ++c;
-        continue;
-      }
-      if (c->source == node.get()) {
-        c->destination->slots[c->destinationAttribute]->setClean(true);
-        markDirty(c->destination, c->destinationAttribute);
-      }
-      c = connections.erase(c);
-    }
-    *status = VStatus::kSuccess;
-    return node;
+  return removeLocked(name, status);
+}
+
+NodePtr GraphState::removeLocked(const std::string &name, VStatus *status) {
+  auto found = byName.find(name);
+  if (found == byName.end()) {
+    *status = failure(VStatus::kNotFound, "No node is named " + quoted(name));
+    return nullptr;
   }
-  *status = failure(VStatus::kNotFound, "No node is named " + quoted(name));
-  return nullptr;
+  NodePtr node = std::move(found->second);
+  byName.erase(found);
+  nodes.erase(node->serial);
+  for (const Connection &c : std::vector<Connection>(node->in)) disconnectIndexed(c);
+  // Downstream values stay as they were last taken, and clean.
+  for (const Connection &c : std::vector<Connection>(node->out)) {
+    disconnectIndexed(c);
+    c.destination->slots[c.destinationAttribute]->setClean(true);
+    markDirty(c.destination, c.destinationAttribute);
+  }
+  *status = VStatus::kSuccess;
+  return node;
 }
 
 }  // namespace graph
@@ -213,8 +228,10 @@ VStatus Graph::createNode(const std::string &type, const std::string &name, std:
   {
     std::lock_guard<std::mutex> guard(impl_->mutex);
     std::string chosen = name;
-    for (int n = 1; chosen.empty(); ++n) {
-      std::string candidate = type + std::to_string(n);
+    // A made-up name: the type's name and the next number not taken, which
+    // each type remembers, so that naming costs the same in any scene.
+    for (unsigned long &n = impl_->nextSuffix[type]; chosen.empty();) {
+      std::string candidate = type + std::to_string(++n);
       if (!impl_->findNode(candidate)) chosen = candidate;
     }
     if (!impl_->findNode(chosen)) {
@@ -222,7 +239,7 @@ VStatus Graph::createNode(const std::string &type, const std::string &name, std:
                                type.c_str(), raw->typeId());
       node = std::make_shared<graph::Node>(*impl_, chosen, nodeType, raw);
       node->bind(node);
-      impl_->nodes.push_back(node);
+      impl_->addNode(node);
     }
   }
   if (!node) {  // taken meanwhile by another thread
@@ -245,22 +262,25 @@ void Graph::deleteNodesOfPlugin(const std::string &plugin) {
   for (const RegistrationInfo &r : standin::registrations())
     if (r.plugin == plugin && (r.kind == "Node" || r.kind == "Shape" || r.kind == "Transform"))
       typeNames.push_back(r.name);
-  std::vector<std::string> doomed;
+  std::set<std::string> kinds(typeNames.begin(), typeNames.end());
+  std::vector<graph::NodePtr> doomed;
   {
     std::lock_guard<std::mutex> guard(impl_->mutex);
-    for (const graph::NodePtr &n : impl_->nodes)
-      for (const std::string &t : typeNames)
-        if (n->type->name == t) doomed.push_back(n->name);
+    for (const auto &entry : impl_->nodes)
+      if (kinds.count(entry.second->type->name)) doomed.push_back(entry.second);
+    VStatus status;
+    for (const graph::NodePtr &n : doomed) impl_->removeLocked(n->name, &status);
     // The plug-in may come back with other declarations.
     for (const std::string &t : typeNames) impl_->types.erase(t);
   }
-  for (const std::string &name : doomed) deleteNode(name);
+  doomed.clear();  // deletes the nodes, with no lock held
 }
 
 std::vector<NodeInfo> Graph::nodes() const {
   std::lock_guard<std::mutex> guard(impl_->mutex);
   std::vector<NodeInfo> out;
-  for (const graph::NodePtr &n : impl_->nodes) {
+  for (const auto &entry : impl_->nodes) {
+    const graph::NodePtr &n = entry.second;
     NodeInfo info;
     info.name = n->name;
     info.type = n->type->name;
@@ -275,8 +295,14 @@ void Graph::clear() {
   std::vector<graph::NodePtr> doomed;
   {
     std::lock_guard<std::mutex> guard(impl_->mutex);
-    doomed.swap(impl_->nodes);
-    impl_->connections.clear();
+    for (auto &entry : impl_->nodes) {
+      entry.second->in.clear();
+      entry.second->out.clear();
+      doomed.push_back(std::move(entry.second));
+    }
+    impl_->nodes.clear();
+    impl_->byName.clear();
+    impl_->nextSuffix.clear();
   }
   doomed.clear();  // deletes the nodes, with no lock held
 }

@@ -3,6 +3,10 @@
 #include <standin/Graph.h>
 #include <standin/Objects.h>
 
+#include <set>
+#include <utility>
+#include <vector>
+
 #include "GraphModel.h"
 
 namespace standin {
@@ -27,7 +31,57 @@ thread_local ComputeFrame *tFrame = nullptr;
 
 }  // namespace
 
+namespace {
+
+struct Step {
+  NodePtr node;
+  int attribute;
+  bool expanded;
+};
+
+// While evaluate runs, a thread computes its own node only: the sources of
+// a node are computed on the levels before it, and are taken as they are.
+bool elsewhere(const Node *node) { return tEvaluation.run && tEvaluation.node != node; }
+
+}  // namespace
+
 VStatus GraphState::refresh(const NodePtr &node, int attribute) {
+  if (node->slots[attribute]->isClean()) return VStatus::kSuccess;
+  // Depth first, each value after the dirty values it depends on: a
+  // connected input on its source, a computed attribute on the node's
+  // attributes that affect it.
+  std::vector<Step> stack{{node, attribute, false}};
+  std::set<std::pair<const Node *, int>> seen{{node.get(), attribute}};
+  while (!stack.empty()) {
+    if (!stack.back().expanded) {
+      stack.back().expanded = true;
+      NodePtr n = stack.back().node;
+      int a = stack.back().attribute;
+      std::vector<std::pair<NodePtr, int>> depends;
+      if (!elsewhere(n.get())) {
+        std::lock_guard<std::mutex> guard(mutex);
+        if (const Connection *c = incoming(n.get(), a))
+          depends.push_back({c->source->shared(), c->sourceAttribute});
+        else if (n->type->attributes[a].computed)
+          for (int b : n->type->affectedBy[a]) depends.push_back({n, b});
+      }
+      for (auto &[dn, da] : depends)
+        if (dn && !dn->slots[da]->isClean() && seen.insert({dn.get(), da}).second)
+          stack.push_back({std::move(dn), da, false});
+      continue;
+    }
+    Step step = std::move(stack.back());
+    stack.pop_back();
+    VStatus status = bring(step.node, step.attribute);
+    // What depends on a failed value fails with it, and is not computed.
+    if (!status) return status;
+  }
+  return VStatus::kSuccess;
+}
+
+VStatus GraphState::bring(const NodePtr &node, int attribute) {
+  VDataSlot &slot = *node->slots[attribute];
+  if (slot.isClean()) return VStatus::kSuccess;
   NodePtr source;
   int sourceAttribute = -1;
   {
@@ -37,18 +91,14 @@ VStatus GraphState::refresh(const NodePtr &node, int attribute) {
       sourceAttribute = c->sourceAttribute;
     }
   }
-  VDataSlot &slot = *node->slots[attribute];
   if (source) {
-    if (slot.isClean()) return VStatus::kSuccess;
-    VStatus status = refresh(source, sourceAttribute);
     slot.copyFrom(*source->slots[sourceAttribute]);
-    if (!status) slot.setClean(false);  // taken again once the source computes
-    return status;
+    // Taken again once the source has computed.
+    if (!source->slots[sourceAttribute]->isClean()) slot.setClean(false);
+    return VStatus::kSuccess;
   }
-  if (!node->type->attributes[attribute].computed || slot.isClean()) return VStatus::kSuccess;
-  // While evaluate runs, a thread computes its own node only: the sources of
-  // a node are computed on the levels before it.
-  if (tEvaluation.run && tEvaluation.node != node.get()) return VStatus::kSuccess;
+  if (!node->type->attributes[attribute].computed || elsewhere(node.get()))
+    return VStatus::kSuccess;
   return compute(node, attribute);
 }
 

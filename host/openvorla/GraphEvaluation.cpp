@@ -4,21 +4,29 @@
 // The nodes to compute are those with a dirty computed attribute. A node
 // waits for the nodes upstream of it that are computed too, also through
 // nodes in between that compute nothing; a node's level is one past the
-// highest of those. A level's nodes go round-robin to the threads, which meet
-// at a barrier before the next level, so every source a node reads is
+// highest of those. The threads take a level's nodes in turn and meet at a
+// barrier before the next level, so every source a node reads is
 // computed (or has failed) before the node starts. A node downstream of a
 // failed one is not computed: it stays dirty, as the failed value does.
 //
-// The pool has as many threads as asked for, or as the widest level has nodes
-// if fewer. The caller waits for them, so it must not hold the interpreter
-// lock, which their computes of script nodes take.
+// As many threads as asked for work, or as the widest level has nodes if
+// fewer, from a pool that lives from one evaluation to the next. The caller
+// waits for them, so it must not hold the interpreter lock, which their
+// computes of script nodes take.
 #include <standin/Graph.h>
 
 #include <algorithm>
+#include <atomic>
+#include <functional>
+#include <memory>
 #include <condition_variable>
 #include <map>
 #include <set>
 #include <thread>
+#include <unordered_map>
+#include <unordered_set>
+
+#include <standin/ScriptCallables.h>
 
 #include "GraphModel.h"
 
@@ -83,8 +91,9 @@ class Run : public graph::EvaluationRun {
 // Under the graph's mutex.
 std::vector<Item> dirtyItems(const graph::GraphState &g) {
   std::vector<Item> items;
-  std::map<const graph::Node *, int> index;
-  for (const graph::NodePtr &n : g.nodes) {
+  std::unordered_map<const graph::Node *, int> index;
+  for (const auto &entry : g.nodes) {
+    const graph::NodePtr &n = entry.second;
     Item item;
     for (size_t a = 0; a < n->slots.size(); ++a)
       if (n->type->attributes[a].computed && !n->slots[a]->isClean())
@@ -94,14 +103,15 @@ std::vector<Item> dirtyItems(const graph::GraphState &g) {
     index[n.get()] = static_cast<int>(items.size());
     items.push_back(std::move(item));
   }
+  // Each item's nearest computed nodes upstream, through nodes that compute nothing.
   for (Item &item : items) {
     std::vector<const graph::Node *> work{item.node.get()};
-    std::set<const graph::Node *> seen{item.node.get()};
+    std::unordered_set<const graph::Node *> seen{item.node.get()};
     while (!work.empty()) {
       const graph::Node *n = work.back();
       work.pop_back();
-      for (const graph::Connection &c : g.connections) {
-        if (c.destination != n || !seen.insert(c.source).second) continue;
+      for (const graph::Connection &c : n->in) {
+        if (!seen.insert(c.source).second) continue;
         auto found = index.find(c.source);
         if (found != index.end())
           item.upstream.push_back(found->second);
@@ -113,15 +123,79 @@ std::vector<Item> dirtyItems(const graph::GraphState &g) {
   return items;
 }
 
-int levelOf(std::vector<Item> &items, int i) {
-  Item &item = items[i];
-  if (item.level < 0) {
-    int level = 0;
-    for (int u : item.upstream) level = std::max(level, levelOf(items, u) + 1);
-    item.level = level;
+// One past the highest level upstream, without recursion: chains can be long.
+void assignLevels(std::vector<Item> &items) {
+  for (size_t root = 0; root < items.size(); ++root) {
+    if (items[root].level >= 0) continue;
+    std::vector<int> stack{static_cast<int>(root)};
+    while (!stack.empty()) {
+      Item &item = items[stack.back()];
+      bool ready = true;
+      for (int u : item.upstream)
+        if (items[u].level < 0) {
+          stack.push_back(u);
+          ready = false;
+        }
+      if (!ready) continue;
+      int level = 0;
+      for (int u : item.upstream) level = std::max(level, items[u].level + 1);
+      item.level = level;
+      stack.pop_back();
+    }
   }
-  return item.level;
 }
+
+// Host threads kept for evaluation, made as more are first needed and never
+// ended, so that each keeps what it set up (its interpreter thread state among
+// them) from one evaluation to the next. run() has `count` of them call
+// job(t), t from 0, and returns when all have.
+class Pool {
+ public:
+  static Pool &instance() {
+    static Pool *pool = new Pool;  // never destroyed: its threads never end
+    return *pool;
+  }
+
+  void run(int count, const std::function<void(int)> &job) {
+    std::unique_lock<std::mutex> lock(fMutex);
+    while (static_cast<int>(fThreads.size()) < count) {
+      int t = static_cast<int>(fThreads.size());
+      fThreads.emplace_back([this, t] { work(t); });
+      fThreads.back().detach();
+    }
+    fJob = &job;
+    fCount = count;
+    fPending = count;
+    ++fRound;
+    fStart.notify_all();
+    fDone.wait(lock, [&] { return fPending == 0; });
+    fJob = nullptr;
+  }
+
+ private:
+  void work(int t) {
+    unsigned long seen = 0;
+    std::unique_lock<std::mutex> lock(fMutex);
+    for (;;) {
+      fStart.wait(lock, [&] { return fRound != seen; });
+      seen = fRound;
+      if (t >= fCount) continue;
+      const std::function<void(int)> *job = fJob;
+      lock.unlock();
+      (*job)(t);
+      lock.lock();
+      if (--fPending == 0) fDone.notify_all();
+    }
+  }
+
+  std::mutex fMutex;
+  std::condition_variable fStart, fDone;
+  std::vector<std::thread> fThreads;
+  const std::function<void(int)> *fJob = nullptr;
+  int fCount = 0;
+  int fPending = 0;
+  unsigned long fRound = 0;
+};
 
 void computeItem(graph::GraphState &g, std::vector<Item> &items, Item &item, Run &run) {
   for (int u : item.upstream)
@@ -151,9 +225,10 @@ VStatus Graph::evaluate(int threads) {
     std::lock_guard<std::mutex> guard(impl_->mutex);
     items = dirtyItems(*impl_);
   }
+  assignLevels(items);
   std::vector<std::vector<int>> levels;
   for (int i = 0; i < static_cast<int>(items.size()); ++i) {
-    size_t level = static_cast<size_t>(levelOf(items, i));
+    size_t level = static_cast<size_t>(items[i].level);
     if (levels.size() <= level) levels.resize(level + 1);
     levels[level].push_back(i);
   }
@@ -161,22 +236,34 @@ VStatus Graph::evaluate(int threads) {
   for (const auto &level : levels) widest = std::max(widest, level.size());
 
   Run run;
+  // The threads take a level's nodes one by one from a shared counter. A
+  // thread computing script nodes keeps the interpreter lock from one to the
+  // next rather than taking it anew for each: compute that lets it go
+  // (waiting, hashing, large array work) lets the others take the next nodes
+  // meanwhile.
+  auto computeLevel = [&](const std::vector<int> &level, std::atomic<size_t> &next) {
+    std::unique_ptr<standin::ScriptsHeld> held;
+    for (size_t i; (i = next++) < level.size();) {
+      Item &item = items[level[i]];
+      if (!item.node->type->scripted)
+        held.reset();
+      else if (!held)
+        held = std::make_unique<standin::ScriptsHeld>();
+      computeItem(*impl_, items, item, run);
+    }
+  };
+  std::vector<std::atomic<size_t>> next(levels.size());
   if (threads == 1) {
-    for (const auto &level : levels)
-      for (int i : level) computeItem(*impl_, items, items[i], run);
+    for (size_t l = 0; l < levels.size(); ++l) computeLevel(levels[l], next[l]);
   } else {
     const int workers = static_cast<int>(std::min<size_t>(threads, std::max<size_t>(widest, 1)));
     Barrier barrier(workers);
-    std::vector<std::thread> pool;
-    for (int t = 0; t < workers; ++t)
-      pool.emplace_back([&, t] {
-        for (const auto &level : levels) {
-          for (size_t i = t; i < level.size(); i += workers)
-            computeItem(*impl_, items, items[level[i]], run);
-          barrier.wait();
-        }
-      });
-    for (std::thread &t : pool) t.join();
+    Pool::instance().run(workers, [&](int) {
+      for (size_t l = 0; l < levels.size(); ++l) {
+        computeLevel(levels[l], next[l]);
+        barrier.wait();
+      }
+    });
   }
   {
     std::lock_guard<std::mutex> guard(impl_->mutex);

@@ -24,6 +24,7 @@
 #include <memory>
 #include <mutex>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 #include "DataBlockState.h"
@@ -57,6 +58,8 @@ struct NodeType {
   std::string name;
   unsigned long serial = 0;               // of the registration whose initializer declared it
   std::vector<AttributeSpec> attributes;  // the parent's first, then in declaration order
+  std::vector<std::vector<int>> affectedBy;  // per attribute, those whose change dirties it
+  bool scripted = false;                     // its nodes are made by a script's creator
 
   // By long or brief name, or by object; -1 when the type has none.
   int find(const std::string &name) const;
@@ -64,6 +67,14 @@ struct NodeType {
 };
 
 class GraphState;
+class Node;
+
+struct Connection {
+  Node *source;
+  int sourceAttribute;
+  Node *destination;
+  int destinationAttribute;
+};
 
 class Node : public ov::DataBlockOwner {
  public:
@@ -87,10 +98,15 @@ class Node : public ov::DataBlockOwner {
   const std::string name;
   const std::shared_ptr<const NodeType> type;
   ov::VPxNode *const node;
+  unsigned long serial = 0;  // the order of creation
   ov::VDataBlock block;
   std::vector<std::shared_ptr<ov::VDataSlot>> slots;  // one per attribute of the type
   std::vector<char> computing;                        // under the graph's mutex
   std::atomic<long> computeCount{0};
+  // Under the graph's mutex: the connections into and out of the node, and
+  // per attribute the mark of the last walk that reached it.
+  std::vector<Connection> in, out;
+  std::vector<unsigned long> walked;
 
  private:
   std::weak_ptr<Node> fSelf;
@@ -98,12 +114,6 @@ class Node : public ov::DataBlockOwner {
 
 using NodePtr = std::shared_ptr<Node>;
 
-struct Connection {
-  Node *source;
-  int sourceAttribute;
-  Node *destination;
-  int destinationAttribute;
-};
 
 // What a thread does for evaluate(): its computes are noted, and it computes
 // only the node it was given; a read of another dirty node's value takes the
@@ -130,16 +140,26 @@ class GraphState {
   const Connection *incoming(const Node *node, int attribute) const;
   // Marks dirty what a change of the attribute's value affects: the node's
   // attributes it affects, and through connections everything downstream.
+  // A value found dirty already has everything downstream of it dirty (a
+  // value is only cleaned after what it depends on), so the walk stops there.
   void markDirty(Node *node, int attribute);
+  void addNode(const NodePtr &node);
+  void connectIndexed(const Connection &c);
+  void disconnectIndexed(const Connection &c);
   // "node.attribute" to the node and the attribute's index.
   ov::VStatus parsePlug(const std::string &plug, NodePtr *node, int *attribute) const;
   // Whether a connection path leads from one node to the other.
   bool reaches(const Node *from, const Node *to) const;
 
   // With no lock held.
-  // Brings the value up to date: a connected input from its source, a dirty
-  // computed attribute by its node's compute.
+  // Brings the value up to date: first, in a loop, every dirty value it
+  // depends on, upstream first (a connected input takes its source's value,
+  // a computed one its node's compute), so that no compute has to pull
+  // another from inside itself, however long the chain.
   ov::VStatus refresh(const NodePtr &node, int attribute);
+  // One value, what it depends on up to date: a connected input takes its
+  // source's value, a dirty computed one its node's compute.
+  ov::VStatus bring(const NodePtr &node, int attribute);
   // Calls the node's compute for the dirty attribute; the attribute is clean
   // afterwards unless the compute failed.
   ov::VStatus compute(const NodePtr &node, int attribute);
@@ -150,10 +170,14 @@ class GraphState {
   // caller drops the pointer (and so may delete the node) after the calls
   // into the other nodes are made.
   NodePtr remove(const std::string &name, ov::VStatus *status);
+  NodePtr removeLocked(const std::string &name, ov::VStatus *status);  // under mutex
 
   mutable std::mutex mutex;
-  std::vector<NodePtr> nodes;  // in the order they were made
-  std::vector<Connection> connections;
+  std::map<unsigned long, NodePtr> nodes;  // by serial: in the order they were made
+  std::unordered_map<std::string, NodePtr> byName;
+  std::unordered_map<std::string, unsigned long> nextSuffix;  // per type, for made-up names
+  unsigned long madeNodes = 0;
+  unsigned long walks = 0;
   std::map<std::string, std::shared_ptr<const NodeType>> types;
   std::vector<int> lastThreads;
   std::mutex initializing;  // one initializer at a time: declarations are process-wide

@@ -2,6 +2,7 @@
 // the dirty marks that a change sends downstream.
 #include <standin/Graph.h>
 
+#include <algorithm>
 #include <set>
 #include <utility>
 
@@ -17,18 +18,35 @@ using graph::quoted;
 namespace graph {
 
 const Connection *GraphState::incoming(const Node *node, int attribute) const {
-  for (const Connection &c : connections)
-    if (c.destination == node && c.destinationAttribute == attribute) return &c;
+  for (const Connection &c : node->in)
+    if (c.destinationAttribute == attribute) return &c;
   return nullptr;
 }
 
-// Every value reached is marked, even one already dirty: a compute that did
-// not read a dirty input has left its outputs clean behind it.
+void GraphState::connectIndexed(const Connection &c) {
+  c.source->out.push_back(c);
+  c.destination->in.push_back(c);
+}
+
+void GraphState::disconnectIndexed(const Connection &c) {
+  auto same = [&](const Connection &o) {
+    return o.source == c.source && o.sourceAttribute == c.sourceAttribute &&
+           o.destination == c.destination && o.destinationAttribute == c.destinationAttribute;
+  };
+  auto &out = c.source->out;
+  out.erase(std::remove_if(out.begin(), out.end(), same), out.end());
+  auto &in = c.destination->in;
+  in.erase(std::remove_if(in.begin(), in.end(), same), in.end());
+}
+
 void GraphState::markDirty(Node *node, int attribute) {
+  const unsigned long walk = ++walks;
   std::vector<std::pair<Node *, int>> work{{node, attribute}};
-  std::set<std::pair<Node *, int>> seen(work.begin(), work.end());
+  node->walked[attribute] = walk;
   auto reach = [&](Node *n, int a) {
-    if (!seen.insert({n, a}).second) return;
+    if (n->walked[a] == walk) return;
+    n->walked[a] = walk;
+    if (!n->slots[a]->isClean()) return;  // and so is everything after it
     n->slots[a]->setClean(false);
     work.push_back({n, a});
   };
@@ -36,8 +54,8 @@ void GraphState::markDirty(Node *node, int attribute) {
     auto [n, a] = work.back();
     work.pop_back();
     for (int affected : n->type->attributes[a].affects) reach(n, affected);
-    for (const Connection &c : connections)
-      if (c.source == n && c.sourceAttribute == a) reach(c.destination, c.destinationAttribute);
+    for (const Connection &c : n->out)
+      if (c.sourceAttribute == a) reach(c.destination, c.destinationAttribute);
   }
 }
 
@@ -48,8 +66,8 @@ bool GraphState::reaches(const Node *from, const Node *to) const {
     const Node *n = work.back();
     work.pop_back();
     if (n == to) return true;
-    for (const Connection &c : connections)
-      if (c.source == n && seen.insert(c.destination).second) work.push_back(c.destination);
+    for (const Connection &c : n->out)
+      if (seen.insert(c.destination).second) work.push_back(c.destination);
   }
   return false;
 }
@@ -144,7 +162,7 @@ VStatus Graph::connect(const std::string &source, const std::string &destination
     if (from == to || impl_->reaches(to.get(), from.get()))
       return failure(VStatus::kFailure, "Connecting " + quoted(fromName) + " to " + quoted(toName) +
                                             " would make a cycle");
-    impl_->connections.push_back({from.get(), fromAttribute, to.get(), toAttribute});
+    impl_->connectIndexed({from.get(), fromAttribute, to.get(), toAttribute});
     to->slots[toAttribute]->setClean(false);
     impl_->markDirty(to.get(), toAttribute);
   }
@@ -164,17 +182,12 @@ VStatus Graph::disconnect(const std::string &source, const std::string &destinat
     VStatus status = impl_->parsePlug(source, &from, &fromAttribute);
     if (status) status = impl_->parsePlug(destination, &to, &toAttribute);
     if (!status) return status;
-    auto &all = impl_->connections;
-    auto it = all.begin();
-    while (it != all.end() &&
-           !(it->source == from.get() && it->sourceAttribute == fromAttribute &&
-             it->destination == to.get() && it->destinationAttribute == toAttribute))
-      ++it;
-    if (it == all.end())
+    const graph::Connection *c = impl_->incoming(to.get(), toAttribute);
+    if (!c || c->source != from.get() || c->sourceAttribute != fromAttribute)
       return failure(VStatus::kFailure, quoted(from->plugName(fromAttribute)) +
                                             " is not connected to " +
                                             quoted(to->plugName(toAttribute)));
-    all.erase(it);
+    impl_->disconnectIndexed(graph::Connection(*c));
     // The destination keeps the value it last took from the source.
     to->slots[toAttribute]->setClean(true);
     impl_->markDirty(to.get(), toAttribute);

@@ -374,6 +374,11 @@ using namespace OPENVORLA_NAMESPACE;
 
 void setScriptCallableHooks(const ScriptCallableHooks *hooks) { gHooks.store(hooks); }
 
+ScriptsHeld::ScriptsHeld() : fHooks(gHooks.load()), fHeld(fHooks ? fHooks->hold() : nullptr) {}
+ScriptsHeld::~ScriptsHeld() {
+  if (fHooks) fHooks->unhold(fHeld);
+}
+
 std::vector<RegistrationInfo> registrations() {
   std::vector<RegistrationPtr> entries;
   {

@@ -117,7 +117,10 @@ void release(PyObject *object) {
   Py_DECREF(object);
 }
 
-const standin::ScriptCallableHooks kHooks{&create, &run, &release};
+void *hold() { return new TpythonLock; }
+void unhold(void *held) { delete static_cast<TpythonLock *>(held); }
+
+const standin::ScriptCallableHooks kHooks{&create, &run, &release, &hold, &unhold};
 
 // Installed while the engine is loaded.
 struct Installation {

@@ -193,7 +193,8 @@ class TestEvaluation:
             host.graph_evaluate(threads)
             # One compute per node; reading the values computes nothing more.
             assert sum(computes().values()) - before == self.WIDTH * self.DEPTH
-            assert host.graph_threads() == list(range(threads))
+            # The threads take the nodes in turn; those that found one computed.
+            assert 1 <= len(host.graph_threads()) <= threads
             results[threads, shift] = self.values(rows)
             assert sum(computes().values()) - before == self.WIDTH * self.DEPTH
         assert results[1, 0.0] == results[8, 0.0] == self.expected(

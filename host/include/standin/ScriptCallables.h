@@ -20,6 +20,26 @@ struct ScriptCallableHooks {
   bool (*run)(PyObject *callable);
   // Drops the reference the registry holds.
   void (*release)(PyObject *object);
+  // Holds the interpreter lock for the calling thread until released, so
+  // that a run of script calls (a worker's share of an evaluation) takes it
+  // once; script code that lets it go (waiting, hashing, large array work)
+  // still lets other threads run.
+  void *(*hold)();
+  void (*unhold)(void *held);
+};
+
+// The interpreter lock held for a run of script calls, while it lives; does
+// nothing without a scripting engine.
+class OPENVORLA_EXPORT ScriptsHeld {
+ public:
+  ScriptsHeld();
+  ~ScriptsHeld();
+  ScriptsHeld(const ScriptsHeld &) = delete;
+  ScriptsHeld &operator=(const ScriptsHeld &) = delete;
+
+ private:
+  const ScriptCallableHooks *fHooks;
+  void *fHeld;
 };
 
 // hooks must outlive their use; null uninstalls them. Without hooks, script
