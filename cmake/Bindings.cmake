@@ -32,7 +32,7 @@ function(openvorla_binding manifest)
   set(stamp ${gen_dir}/${stem}.stamp)
   add_custom_command(
     OUTPUT ${stamp}
-    BYPRODUCTS ${outputs} ${PACKAGE_DIR}/${stem}.py
+    BYPRODUCTS ${outputs} ${PACKAGE_DIR}/${stem}.py ${PACKAGE_DIR}/${stem}.interface.json
     COMMAND ${Python3_EXECUTABLE} -m codegen generate ${manifest_path}
             --include ${CMAKE_SOURCE_DIR}/host/include
             --cxx-out ${gen_dir} --py-out ${PACKAGE_DIR}

@@ -14,7 +14,8 @@ import sys
 from . import manifest as manifest_mod
 from . import model as model_mod
 from . import parse as parse_mod
-from .emit import directors, drive, entries, header, init, proxy, table, types, variables
+from .emit import (directors, drive, entries, header, init, interface, proxy, table, types,
+                   variables)
 from .model.drive import drive_calls
 
 
@@ -97,6 +98,7 @@ def main(argv: list[str]) -> int:
     for name, text in render(module).items():
         _write(os.path.join(args.cxx_out, name), text)
     _write(os.path.join(args.py_out, f'{module.proxy}.py'), proxy.emit(module))
+    _write(os.path.join(args.py_out, f'{module.proxy}.interface.json'), interface.emit(module))
     return 0
 
 
