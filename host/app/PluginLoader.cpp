@@ -25,7 +25,32 @@ struct LoadedPlugin {
   std::string file;  // absolute
   VObject object;
   PyObject *module;  // owned
+  PyObject *folder;  // owned: the entry it put on sys.path, or null
 };
+
+// The plug-in's folder goes first on sys.path while it is loaded, so that it
+// can import the modules it ships beside it. New reference to the entry, or
+// null when it was there already (another plug-in's or the user's).
+PyObject *addFolder(const std::string &folder) {
+  PyObject *path = PySys_GetObject("path");  // borrowed
+  PyObject *entry = PyUnicode_DecodeFSDefault(folder.c_str());
+  if (!path || !entry || PySequence_Contains(path, entry) != 0 ||
+      PyList_Insert(path, 0, entry) < 0) {
+    PyErr_Clear();
+    Py_XDECREF(entry);
+    return nullptr;
+  }
+  return entry;
+}
+
+void removeFolder(PyObject *entry) {
+  if (!entry) return;
+  PyObject *path = PySys_GetObject("path");  // borrowed
+  Py_ssize_t at = path ? PySequence_Index(path, entry) : -1;
+  if (at >= 0) PySequence_DelItem(path, at);
+  PyErr_Clear();
+  Py_DECREF(entry);
+}
 
 // Guarded by the interpreter lock, which every caller holds.
 std::vector<LoadedPlugin> &loaded() {
@@ -60,6 +85,9 @@ PyObject *importFile(const std::string &name, const std::string &file) {
   }
   PyObject *code = Py_CompileString(source.c_str(), file.c_str(), Py_file_input);
   PyObject *globals = PyModule_GetDict(module);  // borrowed
+  // As the import system would: packages look for the builtins there.
+  if (code && PyDict_SetItemString(globals, "__builtins__", PyEval_GetBuiltins()) < 0)
+    Py_CLEAR(code);
   PyObject *done = code ? PyEval_EvalCode(code, globals, globals) : nullptr;
   Py_XDECREF(code);
   if (done) {
@@ -132,10 +160,12 @@ std::string loadPlugin(const std::string &file, std::string *name) {
 
   VObject object = standin::loadPlugin(path.stem().c_str(), path.parent_path().c_str());
   *name = nameOf(object);
+  PyObject *folder = addFolder(path.parent_path().string());
   PyObject *module = importFile(*name, path.string());
   if (!module) {
     reportPythonException();
     forgetPlugin(object);
+    removeFolder(folder);
     return "The plug-in file '" + file + "' failed to import";
   }
   if (!callEntry(module, "initializePlugin", *name, false)) {
@@ -143,10 +173,11 @@ std::string loadPlugin(const std::string &file, std::string *name) {
     deleteObjectsOf(*name, false);
     forgetPlugin(object);
     forgetModule(module);
+    removeFolder(folder);
     return "initializePlugin of the plug-in '" + *name + "' failed";
   }
   *name = nameOf(object);
-  loaded().push_back({path.string(), object, module});
+  loaded().push_back({path.string(), object, module, folder});
   return {};
 }
 
@@ -163,6 +194,7 @@ std::string unloadPlugin(const std::string &name) {
   if (!callEntry(plugin.module, "uninitializePlugin", name, true)) reportPythonException();
   forgetPlugin(plugin.object);
   forgetModule(plugin.module);
+  removeFolder(plugin.folder);
   return {};
 }
 

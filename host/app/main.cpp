@@ -34,7 +34,8 @@ const char kDescription[] =
     "  --threads N    host threads that evaluate the graph (default: one per core)\n"
     "  --help         show this text\n"
     "\n"
-    "Exit status: 0, or 1 when the script raised, 2 for a usage error.\n";
+    "Exit status: 0, or 1 when a plug-in failed to load or the script raised,\n"
+    "2 for a usage error.\n";
 
 struct Options {
   std::vector<std::string> plugins;
@@ -221,13 +222,19 @@ int main(int argc, char **argv) {
   PyThreadState *mainThread = PyEval_SaveThread();
 
   int status = 0;
+  // A plug-in the command line names must load: without it the script would
+  // run in an application that lacks what it expects.
   for (const std::string &file : options.plugins) {
     TpythonLock lock;
     std::string name;
     std::string failure = vorla::loadPlugin(file, &name);
-    if (!failure.empty()) std::fprintf(stderr, "vorla: %s\n", failure.c_str());
+    if (!failure.empty()) {
+      std::fprintf(stderr, "vorla: %s\n", failure.c_str());
+      status = 1;
+      break;
+    }
   }
-  if (!options.script.empty()) {
+  if (status == 0 && !options.script.empty()) {
     TpythonLock lock;
     status = runScript(options.script[0]);
   }

@@ -177,8 +177,13 @@ class TestFailingPlugins:
         broken = vorla.file('broken.py', 'def initializePlugin(obj)\n    pass\n')
         leaving = vorla.file('leaving.py', COUNTER.replace(
             "print('uninit', ", "raise KeyError('still busy', "))
-        done = vorla.run('--plugin', failing, '--plugin', broken, '--plugin', leaving, script='''
+        done = vorla.run(script=f'''
             import vorla
+            for path in ({failing!r}, {broken!r}, {leaving!r}):
+                try:
+                    vorla.load_plugin(path)
+                except RuntimeError as e:
+                    print(e)
             print(vorla.plugins(), vorla.registered())
             vorla.unload_plugin('leaving')
             print(vorla.plugins(), vorla.registered())
@@ -187,6 +192,8 @@ class TestFailingPlugins:
             ''')
         assert done.returncode == 0, done.stderr
         assert done.stdout.splitlines() == [
+            "initializePlugin of the plug-in 'failing' failed",
+            f"The plug-in file '{broken}' failed to import",
             'init leaving',
             "['leaving'] [('Command', 'count', 'leaving')]",
             '[] []',
@@ -195,9 +202,14 @@ class TestFailingPlugins:
             "KeyError: ('still busy', 'leaving')"]
         assert ('Python exception in plug-in:\nTraceback (most recent call last):\n'
                 f'  File "{failing}", line 9, in initializePlugin\n') in done.stderr
-        assert "vorla: initializePlugin of the plug-in 'failing' failed\n" in done.stderr
-        assert f"vorla: The plug-in file '{broken}' failed to import\n" in done.stderr
         assert f'  File "{leaving}", line 15, in uninitializePlugin\n' in done.stderr
+
+    def test_a_plugin_of_the_command_line_that_fails_stops_the_application(self, vorla):
+        broken = vorla.file('broken.py', 'def initializePlugin(obj)\n    pass\n')
+        for plugin in (broken, vorla.tmp_path / 'missing.py'):
+            done = vorla.run('--plugin', str(plugin), script='print("ran")')
+            assert done.returncode == 1 and done.stdout == ''
+        assert done.stderr == f"vorla: No plug-in file '{plugin}'\n"
 
     def test_a_raising_creator_or_compute_fails_that_node_only(self, vorla):
         fragile = vorla.file('fragile.py', FRAGILE)
