@@ -9,6 +9,8 @@
 // through TpythonLock as the host's own threads do.
 #include "Application.h"
 
+#include <openvorla/VFnData.h>
+
 #include <basekit/Tlog.h>
 #include <standin/Graph.h>
 #include <standin/Lifetime.h>
@@ -57,6 +59,41 @@ PyObject *listOf(const Items &items, Make make) {
   return list;
 }
 
+// A number of a list, or false.
+bool listNumber(PyObject *item, double *out) {
+  if (!PyLong_Check(item) && !PyFloat_Check(item)) return false;
+  *out = PyFloat_AsDouble(item);
+  return !PyErr_Occurred();
+}
+
+// A list (or tuple) of numbers, or of lists of one length of numbers.
+bool toList(PyObject *object, standin::Value *value) {
+  PyObject *items = PySequence_Fast(object, "");
+  if (!items) return false;
+  value->isList = true;
+  Py_ssize_t n = PySequence_Fast_GET_SIZE(items);
+  bool ok = true;
+  for (Py_ssize_t i = 0; ok && i < n; ++i) {
+    PyObject *item = PySequence_Fast_GET_ITEM(items, i);
+    double number;
+    if (listNumber(item, &number)) {
+      ok = i == 0 || value->width == 0;
+      value->numbers.push_back(number);
+    } else if (PyList_Check(item) || PyTuple_Check(item)) {
+      Py_ssize_t width = PySequence_Size(item);
+      ok = width > 0 && (i == 0 || value->width == static_cast<size_t>(width));
+      value->width = static_cast<size_t>(width);
+      for (Py_ssize_t j = 0; ok && j < width; ++j)
+        ok = listNumber(PySequence_Fast_GET_ITEM(item, j), &number) &&
+             (value->numbers.push_back(number), true);
+    } else {
+      ok = false;
+    }
+  }
+  Py_DECREF(items);
+  return ok;
+}
+
 bool toValue(PyObject *object, standin::Value *value, const char *function) {
   if (PyUnicode_Check(object)) {
     Py_ssize_t size;
@@ -70,13 +107,36 @@ bool toValue(PyObject *object, standin::Value *value, const char *function) {
     value->number = PyFloat_AsDouble(object);
     return !PyErr_Occurred();
   }
-  PyErr_Format(PyExc_TypeError, "%s() takes numbers and strings, not '%.200s'", function,
-               Py_TYPE(object)->tp_name);
+  if ((PyList_Check(object) || PyTuple_Check(object)) && toList(object, value)) return true;
+  if (!PyErr_Occurred())
+    PyErr_Format(PyExc_TypeError,
+                 "%s() takes a number, a string, or a list of numbers or of lists of numbers, "
+                 "not '%.200s'",
+                 function, Py_TYPE(object)->tp_name);
   return false;
 }
 
 PyObject *fromValue(const standin::Value &value) {
-  return value.isString ? str(value.text) : PyFloat_FromDouble(value.number);
+  if (!value.isList) return value.isString ? str(value.text) : PyFloat_FromDouble(value.number);
+  const bool integers = value.dataType == OPENVORLA_NAMESPACE::VFnData::kIntArray;
+  auto number = [integers](double n) {
+    return integers ? PyLong_FromDouble(n) : PyFloat_FromDouble(n);
+  };
+  const size_t width = value.width ? value.width : 1;
+  PyObject *list = PyList_New(0);
+  for (size_t i = 0; list && i < value.numbers.size(); i += width) {
+    PyObject *item;
+    if (value.width) {
+      item = PyList_New(static_cast<Py_ssize_t>(width));
+      for (size_t j = 0; item && j < width; ++j)
+        PyList_SET_ITEM(item, static_cast<Py_ssize_t>(j), number(value.numbers[i + j]));
+    } else {
+      item = number(value.numbers[i]);
+    }
+    if (!item || PyList_Append(list, item) < 0) Py_CLEAR(list);
+    Py_XDECREF(item);
+  }
+  return list;
 }
 
 // --- plug-ins and what they registered ---

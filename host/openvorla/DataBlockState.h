@@ -21,11 +21,17 @@
 
 OPENVORLA_NAMESPACE_OPEN
 
+// One value: a number, a string, or numbers of a kind, which is a VFnData::Type:
+// kNumeric for a compound of two to four (a point, a vector, a color),
+// kMatrix for sixteen (row by row), an array kind for its elements (points
+// and vectors three numbers each).
 struct VDataSlot {
   std::mutex mutex;
   double number = 0.0;
   VString text;
   bool isText = false;
+  int dataType = 0;  // 0: a number or a string
+  std::vector<double> numbers;
   bool clean = false;
 
   void setNumber(double value, bool makeClean) {
@@ -33,6 +39,8 @@ struct VDataSlot {
     number = value;
     text = VString();
     isText = false;
+    dataType = 0;
+    numbers.clear();
     if (makeClean) clean = true;
   }
   void setText(const std::string &value, bool makeClean) {
@@ -40,6 +48,17 @@ struct VDataSlot {
     number = 0.0;
     text = value.c_str();
     isText = true;
+    dataType = 0;
+    numbers.clear();
+    if (makeClean) clean = true;
+  }
+  void setNumbers(int type, std::vector<double> values, bool makeClean) {
+    std::lock_guard<std::mutex> guard(mutex);
+    number = 0.0;
+    text = VString();
+    isText = false;
+    dataType = type;
+    numbers = std::move(values);
     if (makeClean) clean = true;
   }
   void setClean(bool state) {
@@ -55,16 +74,22 @@ struct VDataSlot {
     double n;
     VString t;
     bool isT;
+    int type;
+    std::vector<double> values;
     {
       std::lock_guard<std::mutex> guard(other.mutex);
       n = other.number;
       t = other.text;
       isT = other.isText;
+      type = other.dataType;
+      values = other.numbers;
     }
     std::lock_guard<std::mutex> guard(mutex);
     number = n;
     text = t;
     isText = isT;
+    dataType = type;
+    numbers = std::move(values);
     clean = true;
   }
 };

@@ -4,11 +4,14 @@
 #include <standin/Nodes.h>
 #include <standin/Objects.h>
 #include <standin/Registry.h>
+#include <openvorla/VFnData.h>
+#include <openvorla/VFnNumericData.h>
 
 #include <cctype>
 #include <set>
 #include <utility>
 
+#include "BaseAttributes.h"
 #include "GraphModel.h"
 #include "ObjectRecords.h"
 
@@ -49,6 +52,14 @@ void Node::bind(const std::shared_ptr<Node> &self) {
     std::shared_ptr<VDataSlot> slot = VDataBlockAccess::slot(block, spec.object);
     if (spec.isString)
       slot->setText(spec.defaultText, !spec.computed);
+    else if (spec.dataType == VFnData::kNumeric)
+      slot->setNumbers(spec.dataType, std::vector<double>(spec.components, spec.defaultNumber),
+                       !spec.computed);
+    else if (spec.dataType == VFnData::kMatrix)
+      slot->setNumbers(spec.dataType, {1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1},
+                       !spec.computed);
+    else if (spec.dataType)
+      slot->setNumbers(spec.dataType, {}, !spec.computed);
     else
       slot->setNumber(spec.defaultNumber, !spec.computed);
     slots.push_back(std::move(slot));
@@ -94,6 +105,21 @@ AttributeSpec specOf(const VObject &object) {
   spec.briefName = info.briefName;
   spec.isString = info.isString;
   spec.numericType = info.numericType;
+  spec.dataType = info.isString ? 0 : info.dataType;
+  switch (info.numericType) {
+    case VFnNumericData::k2Float:
+    case VFnNumericData::k2Double:
+      spec.components = 2;
+      break;
+    case VFnNumericData::k3Float:
+    case VFnNumericData::k3Double:
+      spec.components = 3;
+      break;
+    case VFnNumericData::k4Double:
+      spec.components = 4;
+      break;
+  }
+  if (spec.components) spec.dataType = VFnData::kNumeric;
   spec.defaultNumber = info.defaultNumber;
   spec.defaultText = info.defaultText;
   spec.readable = info.readable;
@@ -139,23 +165,29 @@ std::shared_ptr<const NodeType> GraphState::nodeType(const std::string &typeName
   auto type = std::make_shared<NodeType>();
   type->name = typeName;
   type->serial = serial;
+  // Whether a script's creator makes the nodes.
+  for (const RegistrationInfo &r : standin::registrations())
+    if (r.name == typeName && (r.kind == "Node" || r.kind == "Shape" || r.kind == "Transform"))
+      for (const RegisteredCallback &c : r.callbacks)
+        if (c.role == "creator" && c.script) type->scripted = true;
   if (!declared.parent.empty()) {
     std::shared_ptr<const NodeType> parent = nodeType(declared.parent, status);
     if (!parent) return nullptr;
     type->attributes = parent->attributes;
   }
+  // The attributes the kind's proxy class gives its nodes come first.
+  bases::Declared base = bases::ofKind(standin::nodeKind(typeName));
+  for (const VObject &object : base.attributes)
+    if (type->find(object) < 0) type->attributes.push_back(specOf(object));
   for (const VObject &object : declared.attributes)
     if (type->find(object) < 0) type->attributes.push_back(specOf(object));
+  declared.affects.insert(declared.affects.end(), base.affects.begin(), base.affects.end());
   for (const auto &affects : declared.affects) {
     int from = type->find(affects.first), to = type->find(affects.second);
     if (from < 0 || to < 0 || from == to) continue;
     type->attributes[from].affects.push_back(to);
     type->attributes[to].computed = true;
   }
-  for (const RegistrationInfo &r : standin::registrations())
-    if (r.name == typeName && (r.kind == "Node" || r.kind == "Shape" || r.kind == "Transform"))
-      for (const RegisteredCallback &c : r.callbacks)
-        if (c.role == "creator" && c.script) type->scripted = true;
   type->affectedBy.assign(type->attributes.size(), {});
   for (size_t from = 0; from < type->attributes.size(); ++from)
     for (int to : type->attributes[from].affects)

@@ -7,6 +7,7 @@
 #include <utility>
 #include <vector>
 
+#include "BaseAttributes.h"
 #include "GraphModel.h"
 
 namespace standin {
@@ -120,6 +121,11 @@ VStatus GraphState::compute(const NodePtr &node, int attribute) {
   ++node->computeCount;
   if (tEvaluation.run) tEvaluation.run->noteCompute();
   VStatus status = guarded([&] { return node->node->compute(plug, node->block); });
+  // Left to the host: what the node's kind computes, if anything.
+  if (status == VStatus::kUnknownParameter && !frame.inputFailed) {
+    VStatus made = guarded([&] { return bases::compute(*node, attribute); });
+    if (made != VStatus::kUnknownParameter) status = made;
+  }
   tFrame = frame.outer;
   {
     std::lock_guard<std::mutex> guard(mutex);

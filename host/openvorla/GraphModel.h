@@ -41,6 +41,8 @@ struct AttributeSpec {
   std::string briefName;
   bool isString = false;
   int numericType = 0;
+  int dataType = 0;       // VFnData::Type of its data: 0 number or string, kNumeric compound
+  size_t components = 0;  // of a compound
   double defaultNumber = 0.0;
   std::string defaultText;
   bool readable = true;

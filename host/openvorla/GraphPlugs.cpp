@@ -6,6 +6,8 @@
 #include <set>
 #include <utility>
 
+#include <openvorla/VFnData.h>
+
 #include "AttributeSets.h"
 #include "GraphModel.h"
 
@@ -78,6 +80,56 @@ namespace {
 
 const char *holds(bool isString) { return isString ? "a string" : "a number"; }
 
+// What an attribute holds, in words.
+std::string holds(const graph::AttributeSpec &spec) {
+  switch (spec.dataType) {
+    case 0:
+      return holds(spec.isString);
+    case VFnData::kNumeric:
+      return std::to_string(spec.components) + " numbers";
+    case VFnData::kMatrix:
+      return "a matrix (4 rows of 4 numbers)";
+    case VFnData::kDoubleArray:
+      return "an array of numbers";
+    case VFnData::kIntArray:
+      return "an array of integers";
+    case VFnData::kPointArray:
+      return "an array of points (lists of 3 numbers)";
+    default:
+      return "an array of vectors (lists of 3 numbers)";
+  }
+}
+
+std::string given(const Value &value) {
+  if (!value.isList) return holds(value.isString);
+  if (value.width) return "lists of " + std::to_string(value.width) + " numbers";
+  return "a list of " + std::to_string(value.numbers.size()) + " numbers";
+}
+
+// The numbers of a list as the attribute holds them; false when the list has
+// not its shape.
+bool fits(const graph::AttributeSpec &spec, const Value &value) {
+  if (!value.isList) return !spec.dataType && value.isString == spec.isString;
+  const size_t n = value.numbers.size();
+  switch (spec.dataType) {
+    case VFnData::kNumeric:
+      return !value.width && n == spec.components;
+    case VFnData::kMatrix:
+      return n == 16 && (value.width == 4 || value.width == 0);
+    case VFnData::kDoubleArray:
+      return !value.width || !n;
+    case VFnData::kIntArray:
+      return (!value.width || !n) &&
+             std::all_of(value.numbers.begin(), value.numbers.end(),
+                         [](double v) { return v == static_cast<double>(static_cast<int>(v)); });
+    case VFnData::kPointArray:
+    case VFnData::kVectorArray:
+      return value.width == 3 || !n;
+    default:
+      return false;
+  }
+}
+
 // The number as the attribute keeps it: of its type, within its range.
 double stored(const graph::AttributeSpec &spec, double value) {
   value = attributes::numericValue(spec.numericType, value);
@@ -101,14 +153,19 @@ VStatus Graph::setAttr(const std::string &plug, const Value &value) {
   if (const graph::Connection *c = impl_->incoming(node.get(), a))
     return failure(VStatus::kFailure, "The plug " + quoted(name) + " takes its value from " +
                                           quoted(c->source->plugName(c->sourceAttribute)));
-  if (value.isString != spec.isString)
-    return failure(VStatus::kInvalidParameter, "The plug " + quoted(name) + " holds " +
-                                                   holds(spec.isString) + ", not " +
-                                                   holds(value.isString));
-  if (spec.isString)
+  if (!fits(spec, value))
+    return failure(VStatus::kInvalidParameter,
+                   "The plug " + quoted(name) + " holds " + holds(spec) + ", not " + given(value));
+  if (spec.isString) {
     node->slots[a]->setText(value.text, true);
-  else
+  } else if (spec.dataType) {
+    std::vector<double> numbers = value.numbers;
+    if (spec.dataType == VFnData::kNumeric)
+      for (double &n : numbers) n = stored(spec, n);
+    node->slots[a]->setNumbers(spec.dataType, std::move(numbers), true);
+  } else {
     node->slots[a]->setNumber(stored(spec, value.number), true);
+  }
   impl_->markDirty(node.get(), a);
   return VStatus::kSuccess;
 }
@@ -125,9 +182,20 @@ VStatus Graph::getAttr(const std::string &plug, Value *value) {
   if (!status) return status;
   VDataSlot &slot = *node->slots[a];
   std::lock_guard<std::mutex> guard(slot.mutex);
-  value->isString = node->type->attributes[a].isString;
+  const graph::AttributeSpec &spec = node->type->attributes[a];
+  value->isString = spec.isString;
   value->number = value->isString || slot.isText ? 0.0 : slot.number;
   value->text = value->isString && slot.isText ? slot.text.asUTF8() : "";
+  if (spec.dataType) {
+    value->isList = true;
+    value->dataType = spec.dataType;
+    // A compute that set another kind of value leaves the attribute's own empty.
+    value->numbers = slot.dataType == spec.dataType ? slot.numbers : std::vector<double>();
+    value->width = spec.dataType == VFnData::kPointArray || spec.dataType == VFnData::kVectorArray
+                       ? 3
+                   : spec.dataType == VFnData::kMatrix ? 4
+                                                       : 0;
+  }
   return VStatus::kSuccess;
 }
 
@@ -148,11 +216,11 @@ VStatus Graph::connect(const std::string &source, const std::string &destination
     if (!toSpec.writable)
       return failure(VStatus::kFailure,
                      "The plug " + quoted(toName) + " is not writable: it is no destination");
-    if (fromSpec.isString != toSpec.isString)
+    if (holds(fromSpec) != holds(toSpec))
       return failure(VStatus::kInvalidParameter, "Cannot connect " + quoted(fromName) +
-                                                     ", which holds " + holds(fromSpec.isString) +
+                                                     ", which holds " + holds(fromSpec) +
                                                      ", to " + quoted(toName) + ", which holds " +
-                                                     holds(toSpec.isString));
+                                                     holds(toSpec));
     if (const graph::Connection *c = impl_->incoming(to.get(), toAttribute))
       return failure(VStatus::kFailure,
                      c->source == from.get() && c->sourceAttribute == fromAttribute

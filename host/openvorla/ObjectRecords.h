@@ -11,6 +11,7 @@
 #include <functional>
 #include <mutex>
 #include <string>
+#include <vector>
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -20,6 +21,7 @@ OPENVORLA_NAMESPACE_OPEN
 struct AttributeInfo {
   bool isString = false;  // a typed string attribute; otherwise numeric
   int numericType = 0;    // the VFnNumericData::Type of a numeric attribute
+  int dataType = 0;       // the VFnData::Type of a typed attribute (0: numeric)
   std::string briefName;
   double defaultNumber = 0.0;
   std::string defaultText;
@@ -40,8 +42,12 @@ struct VObject::Record {
   std::atomic<int> refs{1};
   const VFn::Type type;
   const std::string name;
-  std::mutex mutex;  // guards attribute
+  std::mutex mutex;  // guards attribute and the data
   AttributeInfo attribute;
+  // A data object's kind (a VFnData::Type) and its numbers: an array's
+  // elements (points and vectors three numbers each), a matrix's sixteen.
+  int dataType = 0;
+  std::vector<double> data;
 };
 
 // The one place that makes records and reads them.
@@ -55,6 +61,12 @@ class VObjectFactory {
   // Changes the declaration under the record's lock; false as above.
   static bool updateAttribute(const VObject &object,
                               const std::function<void(AttributeInfo &)> &change);
+  // Data objects, as the data function sets make and read them.
+  static VObject makeData(int dataType, std::vector<double> numbers);
+  // False for an object that is no data object of that kind (any kind: 0).
+  static bool readData(const VObject &object, int dataType, int *kind,
+                       std::vector<double> *numbers);
+  static bool writeData(const VObject &object, int dataType, std::vector<double> numbers);
 };
 
 OPENVORLA_NAMESPACE_CLOSE

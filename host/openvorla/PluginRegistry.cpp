@@ -18,6 +18,8 @@
 
 #include <algorithm>
 #include <atomic>
+
+#include "BaseAttributes.h"
 #include <cstdio>
 #include <cstring>
 #include <mutex>
@@ -379,6 +381,14 @@ ScriptsHeld::~ScriptsHeld() {
   if (fHooks) fHooks->unhold(fHeld);
 }
 
+int nodeKind(const std::string &typeName) {
+  RegistrationPtr r = findNamed(VString(typeName.c_str()), isNodeKind);
+  if (!r) return VPxNode::kDependNode;
+  if (r->kind == RegistrationKind::kTransform) return VPxNode::kTransformNode;
+  if (r->kind == RegistrationKind::kShape) return VPxNode::kSurfaceShape;
+  return r->flags;
+}
+
 std::vector<RegistrationInfo> registrations() {
   std::vector<RegistrationPtr> entries;
   {
@@ -436,12 +446,12 @@ VStatus initializeNode(const VString &typeName) {
   const Callback &init = *r->find(CallbackRole::kInitializer);
   // The declarations end however the initializer does, a C++ exception included.
   struct Declaring {
-    Declaring() { beginNodeType(); }
+    explicit Declaring(int kind) { beginNodeType(bases::ofKind(kind).attributes); }
     ~Declaring() { endNodeType(); }
   };
   VStatus status = VStatus::kSuccess;
   {
-    Declaring declaring;
+    Declaring declaring(nodeKind(typeName.asUTF8()));
     if (!init.script) {
       status = reinterpret_cast<VInitializeFunction>(init.function)();
     } else {

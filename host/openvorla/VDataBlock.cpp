@@ -4,7 +4,10 @@
 
 #include <utility>
 
+#include <openvorla/VFnData.h>
+
 #include "DataBlockState.h"
+#include "ObjectRecords.h"
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -50,6 +53,56 @@ void VDataHandle::setString(const VString &value) {
   fSlot->number = 0.0;
   fSlot->text = value;
   fSlot->isText = true;
+}
+
+VVector VDataHandle::asVector() const {
+  if (!fSlot) return VVector();
+  std::lock_guard<std::mutex> guard(fSlot->mutex);
+  const std::vector<double> &n = fSlot->numbers;
+  if (fSlot->dataType != VFnData::kNumeric || n.size() < 2) return VVector();
+  return VVector(n[0], n[1], n.size() > 2 ? n[2] : 0.0);
+}
+
+VMatrix VDataHandle::asMatrix() const {
+  if (!fSlot) return VMatrix();
+  std::lock_guard<std::mutex> guard(fSlot->mutex);
+  if (fSlot->dataType != VFnData::kMatrix || fSlot->numbers.size() != 16) return VMatrix();
+  double rows[4][4];
+  for (int i = 0; i < 16; ++i) rows[i / 4][i % 4] = fSlot->numbers[i];
+  return VMatrix(rows);
+}
+
+VObject VDataHandle::data() const {
+  if (!fSlot) return VObject();
+  std::lock_guard<std::mutex> guard(fSlot->mutex);
+  if (!fSlot->dataType || fSlot->dataType == VFnData::kNumeric) return VObject();
+  return VObjectFactory::makeData(fSlot->dataType, fSlot->numbers);
+}
+
+void VDataHandle::set2Double(double x, double y) {
+  if (fSlot) fSlot->setNumbers(VFnData::kNumeric, {x, y}, false);
+}
+
+void VDataHandle::set3Double(double x, double y, double z) {
+  if (fSlot) fSlot->setNumbers(VFnData::kNumeric, {x, y, z}, false);
+}
+
+void VDataHandle::setMVector(const VVector &value) { set3Double(value.x, value.y, value.z); }
+
+void VDataHandle::setMMatrix(const VMatrix &value) {
+  if (!fSlot) return;
+  std::vector<double> numbers(16);
+  for (int i = 0; i < 16; ++i) numbers[i] = value(i / 4, i % 4);
+  fSlot->setNumbers(VFnData::kMatrix, std::move(numbers), false);
+}
+
+VStatus VDataHandle::setMObject(const VObject &data) {
+  int kind = 0;
+  std::vector<double> numbers;
+  if (!VObjectFactory::readData(data, 0, &kind, &numbers))
+    return VStatus(VStatus::kInvalidParameter, "The object is not a data object");
+  if (fSlot) fSlot->setNumbers(kind, std::move(numbers), false);
+  return VStatus::kSuccess;
 }
 
 void VDataHandle::set(double value) { setDouble(value); }

@@ -33,7 +33,7 @@ VStatus notNumeric() { return VStatus(VStatus::kInvalidParameter, "The attribute
 // The attached attribute's declaration, which must be numeric.
 bool readNumeric(const VObject &attached, AttributeInfo *info, VStatus *ReturnStatus) {
   if (!attributes::read(attached, info, ReturnStatus)) return false;
-  if (!info->isString) return true;
+  if (!info->dataType) return true;
   report(ReturnStatus, notNumeric());
   return false;
 }
@@ -76,6 +76,11 @@ VObject VFnNumericAttribute::create(const VString &fullName, const VString &brie
   VObject attribute = attributes::make(fullName, briefName, info, ReturnStatus);
   if (!attribute.isNull()) setObject(attribute);
   return attribute;
+}
+
+VObject VFnNumericAttribute::createPoint(const VString &fullName, const VString &briefName,
+                                         VStatus *ReturnStatus) {
+  return create(fullName, briefName, VFnNumericData::k3Double, 0.0, ReturnStatus);
 }
 
 VFnNumericData::Type VFnNumericAttribute::unitType(VStatus *ReturnStatus) const {

@@ -1,4 +1,5 @@
-// VFnTypedAttribute: attributes holding data of a kind; the graph holds strings.
+// VFnTypedAttribute: attributes holding data of a kind: strings, matrices and
+// arrays of numbers, integers, points and vectors.
 #include <openvorla/VFnTypedAttribute.h>
 
 #include "AttributeSets.h"
@@ -11,7 +12,7 @@ using attributes::report;
 
 bool readTyped(const VObject &attached, AttributeInfo *info, VStatus *ReturnStatus) {
   if (!attributes::read(attached, info, ReturnStatus)) return false;
-  if (info->isString) return true;
+  if (info->dataType) return true;
   report(ReturnStatus,
          VStatus(VStatus::kInvalidParameter, "The attribute is not a typed attribute"));
   return false;
@@ -36,13 +37,24 @@ VFnTypedAttribute::~VFnTypedAttribute() = default;
 
 VObject VFnTypedAttribute::create(const VString &fullName, const VString &briefName,
                                   VFnData::Type type, VStatus *ReturnStatus) {
-  if (type != VFnData::kString) {
-    report(ReturnStatus,
-           VStatus(VStatus::kInvalidParameter, "Typed attributes hold kString data only"));
-    return VObject();
+  switch (type) {
+    case VFnData::kString:
+    case VFnData::kMatrix:
+    case VFnData::kDoubleArray:
+    case VFnData::kIntArray:
+    case VFnData::kPointArray:
+    case VFnData::kVectorArray:
+      break;
+    default:
+      report(ReturnStatus,
+             VStatus(VStatus::kInvalidParameter,
+                     "Typed attributes hold strings, matrices and arrays of numbers, integers, "
+                     "points or vectors"));
+      return VObject();
   }
   AttributeInfo info;
-  info.isString = true;
+  info.dataType = type;
+  info.isString = type == VFnData::kString;
   VObject attribute = attributes::make(fullName, briefName, info, ReturnStatus);
   if (!attribute.isNull()) setObject(attribute);
   return attribute;
@@ -50,7 +62,8 @@ VObject VFnTypedAttribute::create(const VString &fullName, const VString &briefN
 
 VFnData::Type VFnTypedAttribute::attrType(VStatus *ReturnStatus) const {
   AttributeInfo info;
-  return readTyped(object(), &info, ReturnStatus) ? VFnData::kString : VFnData::kInvalid;
+  return readTyped(object(), &info, ReturnStatus) ? static_cast<VFnData::Type>(info.dataType)
+                                                  : VFnData::kInvalid;
 }
 
 VStatus VFnTypedAttribute::setDefault(const VString &text) {

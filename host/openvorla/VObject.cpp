@@ -37,6 +37,33 @@ bool VObjectFactory::updateAttribute(const VObject &object,
   return true;
 }
 
+VObject VObjectFactory::makeData(int dataType, std::vector<double> numbers) {
+  VObject object = make(VFn::kData, "");
+  object.fRecord->dataType = dataType;
+  object.fRecord->data = std::move(numbers);
+  return object;
+}
+
+bool VObjectFactory::readData(const VObject &object, int dataType, int *kind,
+                              std::vector<double> *numbers) {
+  VObject::Record *record = object.fRecord;
+  if (!record || record->type != VFn::kData) return false;
+  std::lock_guard<std::mutex> guard(record->mutex);
+  if (dataType && record->dataType != dataType) return false;
+  if (kind) *kind = record->dataType;
+  if (numbers) *numbers = record->data;
+  return true;
+}
+
+bool VObjectFactory::writeData(const VObject &object, int dataType, std::vector<double> numbers) {
+  VObject::Record *record = object.fRecord;
+  if (!record || record->type != VFn::kData) return false;
+  std::lock_guard<std::mutex> guard(record->mutex);
+  if (record->dataType != dataType) return false;
+  record->data = std::move(numbers);
+  return true;
+}
+
 VObject::VObject() : fRecord(nullptr) {}
 
 VObject::VObject(const VObject &other) : fRecord(other.fRecord) {

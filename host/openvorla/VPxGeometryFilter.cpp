@@ -5,6 +5,8 @@
 #include <standin/Lifetime.h>
 #include <standin/Objects.h>
 
+#include "BaseAttributes.h"
+
 OPENVORLA_NAMESPACE_OPEN
 
 VPxGeometryFilter::VPxGeometryFilter() : fDeformationDetails(0), fUseExistingConnection(true) {
@@ -50,12 +52,12 @@ void VPxGeometryFilter::setUseExistingConnectionWhenSetEditing(bool state) {
 const char *VPxGeometryFilter::className() { return "VPxGeometryFilter"; }
 
 VObject VPxGeometryFilter::input = standin::makeAttribute("VPxGeometryFilter.input");
-VObject VPxGeometryFilter::inputGeom = standin::makeAttribute("VPxGeometryFilter.inputGeom");
+VObject VPxGeometryFilter::inputGeom = standin::bases::points("inputGeom", "ip", false);
 VObject VPxGeometryFilter::groupId = standin::makeAttribute("VPxGeometryFilter.groupId");
 VObject VPxGeometryFilter::componentTagExpression =
     standin::makeAttribute("VPxGeometryFilter.componentTagExpression");
-VObject VPxGeometryFilter::outputGeom = standin::makeAttribute("VPxGeometryFilter.outputGeom");
-VObject VPxGeometryFilter::envelope = standin::makeAttribute("VPxGeometryFilter.envelope");
+VObject VPxGeometryFilter::outputGeom = standin::bases::points("outputGeom", "og", true);
+VObject VPxGeometryFilter::envelope = standin::bases::number("envelope", "en", 1.0, 0.0, 1.0);
 VObject VPxGeometryFilter::originalGeometry =
     standin::makeAttribute("VPxGeometryFilter.originalGeometry");
 

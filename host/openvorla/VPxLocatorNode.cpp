@@ -1,8 +1,11 @@
 // VPxLocatorNode: construction and the static attribute objects.
 #include <openvorla/VPxLocatorNode.h>
 
+
 #include <standin/Lifetime.h>
 #include <standin/Objects.h>
+
+#include "BaseAttributes.h"
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -37,7 +40,7 @@ const char *VPxLocatorNode::className() { return "VPxLocatorNode"; }
 
 VObject VPxLocatorNode::underWorldObject =
     standin::makeAttribute("VPxLocatorNode.underWorldObject");
-VObject VPxLocatorNode::localPosition = standin::makeAttribute("VPxLocatorNode.localPosition");
+VObject VPxLocatorNode::localPosition = standin::bases::triple("localPosition", "lp", 0.0);
 VObject VPxLocatorNode::localPositionX = standin::makeAttribute("VPxLocatorNode.localPositionX");
 VObject VPxLocatorNode::localPositionY = standin::makeAttribute("VPxLocatorNode.localPositionY");
 VObject VPxLocatorNode::localPositionZ = standin::makeAttribute("VPxLocatorNode.localPositionZ");
@@ -45,7 +48,7 @@ VObject VPxLocatorNode::worldPosition = standin::makeAttribute("VPxLocatorNode.w
 VObject VPxLocatorNode::worldPositionX = standin::makeAttribute("VPxLocatorNode.worldPositionX");
 VObject VPxLocatorNode::worldPositionY = standin::makeAttribute("VPxLocatorNode.worldPositionY");
 VObject VPxLocatorNode::worldPositionZ = standin::makeAttribute("VPxLocatorNode.worldPositionZ");
-VObject VPxLocatorNode::localScale = standin::makeAttribute("VPxLocatorNode.localScale");
+VObject VPxLocatorNode::localScale = standin::bases::triple("localScale", "ls", 1.0);
 VObject VPxLocatorNode::localScaleX = standin::makeAttribute("VPxLocatorNode.localScaleX");
 VObject VPxLocatorNode::localScaleY = standin::makeAttribute("VPxLocatorNode.localScaleY");
 VObject VPxLocatorNode::localScaleZ = standin::makeAttribute("VPxLocatorNode.localScaleZ");

@@ -25,12 +25,14 @@ struct NodeTypeDeclarations {
   std::mutex mutex;
   bool open = false;
   std::vector<VObject> attributes;
+  std::vector<VObject> given;  // by the type's kind
   std::vector<std::pair<VObject, VObject>> affects;
   bool inherits = false;
   std::string parent;
 
   bool has(const VObject &attr) {
-    return std::find(attributes.begin(), attributes.end(), attr) != attributes.end();
+    return std::find(attributes.begin(), attributes.end(), attr) != attributes.end() ||
+           std::find(given.begin(), given.end(), attr) != given.end();
   }
 
   // The attribute added before under one of the new one's names, if any.
@@ -294,10 +296,11 @@ void setNodeIdentity(VPxNode &node, const VObject &object, const char *typeName,
   VPxNodeIdentity::set(node, object, typeName, typeId);
 }
 
-void beginNodeType() {
+void beginNodeType(const std::vector<VObject> &given) {
   NodeTypeDeclarations &d = declarations();
   std::lock_guard<std::mutex> guard(d.mutex);
   d.open = true;
+  d.given = given;
   d.attributes.clear();
   d.affects.clear();
   d.inherits = false;

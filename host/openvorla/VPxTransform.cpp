@@ -2,12 +2,15 @@
 // components, and the static attribute objects.
 #include <openvorla/VPxTransform.h>
 
+
 #include <standin/Lifetime.h>
 #include <standin/Objects.h>
 
 #include <algorithm>
 #include <atomic>
 #include <cmath>
+
+#include "BaseAttributes.h"
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -604,7 +607,7 @@ VObject VPxTransform::boundingBoxCenterY =
     standin::makeAttribute("VPxTransform.boundingBoxCenterY");
 VObject VPxTransform::boundingBoxCenterZ =
     standin::makeAttribute("VPxTransform.boundingBoxCenterZ");
-VObject VPxTransform::matrix = standin::makeAttribute("VPxTransform.matrix");
+VObject VPxTransform::matrix = standin::bases::matrix("matrix", "m", true);
 VObject VPxTransform::inverseMatrix = standin::makeAttribute("VPxTransform.inverseMatrix");
 VObject VPxTransform::worldMatrix = standin::makeAttribute("VPxTransform.worldMatrix");
 VObject VPxTransform::worldInverseMatrix =
@@ -647,16 +650,16 @@ VObject VPxTransform::renderLayerId = standin::makeAttribute("VPxTransform.rende
 VObject VPxTransform::renderLayerRenderable =
     standin::makeAttribute("VPxTransform.renderLayerRenderable");
 VObject VPxTransform::renderLayerColor = standin::makeAttribute("VPxTransform.renderLayerColor");
-VObject VPxTransform::translate = standin::makeAttribute("VPxTransform.translate");
+VObject VPxTransform::translate = standin::bases::triple("translate", "t", 0.0);
 VObject VPxTransform::translateX = standin::makeAttribute("VPxTransform.translateX");
 VObject VPxTransform::translateY = standin::makeAttribute("VPxTransform.translateY");
 VObject VPxTransform::translateZ = standin::makeAttribute("VPxTransform.translateZ");
-VObject VPxTransform::rotate = standin::makeAttribute("VPxTransform.rotate");
+VObject VPxTransform::rotate = standin::bases::triple("rotate", "r", 0.0);
 VObject VPxTransform::rotateX = standin::makeAttribute("VPxTransform.rotateX");
 VObject VPxTransform::rotateY = standin::makeAttribute("VPxTransform.rotateY");
 VObject VPxTransform::rotateZ = standin::makeAttribute("VPxTransform.rotateZ");
 VObject VPxTransform::rotateOrder = standin::makeAttribute("VPxTransform.rotateOrder");
-VObject VPxTransform::scale = standin::makeAttribute("VPxTransform.scale");
+VObject VPxTransform::scale = standin::bases::triple("scale", "s", 1.0);
 VObject VPxTransform::scaleX = standin::makeAttribute("VPxTransform.scaleX");
 VObject VPxTransform::scaleY = standin::makeAttribute("VPxTransform.scaleY");
 VObject VPxTransform::scaleZ = standin::makeAttribute("VPxTransform.scaleZ");

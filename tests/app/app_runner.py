@@ -21,6 +21,7 @@ class Vorla:
 
     def file(self, name, text):
         path = self.tmp_path / name
+        path.parent.mkdir(parents=True, exist_ok=True)
         path.write_text(textwrap.dedent(text))
         return str(path)
 

@@ -153,7 +153,9 @@ void testAttributeSets() {
   CHECK(status && typed.attrType() == VFnData::kString && typed.setDefault("/tmp") &&
         typed.defaultString() == "/tmp");
   CHECK(typed.create("mesh", "m", VFnData::kMesh, &status).isNull() &&
-        text(status) == "Typed attributes hold kString data only");
+        text(status) ==
+            "Typed attributes hold strings, matrices and arrays of numbers, integers, points or "
+            "vectors");
   VFnNumericAttribute notNumeric(path, &status);
   CHECK(status == VStatus::kInvalidParameter && notNumeric.object().isNull());
   VFnTypedAttribute notTyped(weight, &status);

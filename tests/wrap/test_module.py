@@ -185,7 +185,7 @@ CAST_LISTS = {
     '_p_m_VFnNurbsSurface__q_const__f_p_VStatus__int': 1,
     # From the sibling, which derives its attribute and data function sets
     # from VFnAttribute and VFnData rather than from VFnBase alone.
-    '_p_VFnAttribute': 2, '_p_VFnData': 1,
+    '_p_VFnAttribute': 2, '_p_VFnData': 6,
 }
 SCALARS = ['bool', 'char', 'short', 'int', 'unsigned_char', 'unsigned_int', 'float', 'double',
            'p_float'] + [f'a_{n}__{t}' for n in (2, 3, 4)

@@ -21,12 +21,16 @@ public:
   ~VFnNumericAttribute() override;
 
   // A new attribute of one value of the type, attached to this function set.
-  // kInvalidParameter, and the null object, for an empty or ill-formed name
-  // (letters, digits and '_', not starting with a digit) or a type that is
-  // not a single value.
+  // A compound type (k2Double ... k4Double) holds that many values, each
+  // defaultValue by default. kInvalidParameter, and the null object, for an
+  // empty or ill-formed name (letters, digits and '_', not starting with a
+  // digit) or a type that is none of VFnNumericData's.
   VObject create(const VString &fullName, const VString &briefName,
                  VFnNumericData::Type unitType, double defaultValue = 0,
                  VStatus *ReturnStatus = NULL);
+  // A point: three doubles (k3Double), each 0 by default.
+  VObject createPoint(const VString &fullName, const VString &briefName,
+                      VStatus *ReturnStatus = NULL);
 
   VFnNumericData::Type unitType(VStatus *ReturnStatus = NULL) const;
   // The graph keeps values set on the attribute within its minimum and

@@ -18,6 +18,12 @@ public:
     kInt64,
     kFloat,
     kDouble,
+    // Compounds of two to four numbers: points, vectors, colors.
+    k2Float,
+    k2Double,
+    k3Float,
+    k3Double,
+    k4Double,
     kLast
   };
 

@@ -13,11 +13,21 @@
 namespace standin {
 
 // One value of an attribute: numeric attributes hold a double (booleans and
-// integers as doubles too), string attributes a string.
+// integers as doubles too), string attributes a string, the others numbers
+// in a row: a compound (a point, a vector, a color), a matrix (row by row),
+// an array (of points and vectors three numbers each).
 struct Value {
   bool isString = false;
   double number = 0.0;
   std::string text;
+  // A list: `numbers` in a row, taken from a list of `width` numbers each
+  // (a list of lists), or of single numbers (width 0).
+  bool isList = false;
+  size_t width = 0;
+  std::vector<double> numbers;
+  // What a value read from a plug holds: 0 for a number or a string, else
+  // the VFnData::Type (kNumeric for a compound).
+  int dataType = 0;
 };
 
 // A node as the application lists it.

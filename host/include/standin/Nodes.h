@@ -20,9 +20,12 @@ OPENVORLA_EXPORT void setNodeIdentity(OPENVORLA_NAMESPACE::VPxNode &node,
                                       const OPENVORLA_NAMESPACE::VTypeId &typeId);
 
 // Starts the declarations of a new node type: forgets the attributes and
-// dependencies declared so far. VPxNode::addAttribute and attributeAffects
-// fail outside the declarations of a type.
-OPENVORLA_EXPORT void beginNodeType();
+// dependencies declared so far. `given`: the attributes the type has by its
+// kind, which attributeAffects may name and addAttribute refuses as added.
+// VPxNode::addAttribute and attributeAffects fail outside the declarations of
+// a type.
+OPENVORLA_EXPORT void beginNodeType(
+    const std::vector<OPENVORLA_NAMESPACE::VObject> &given = {});
 // Ends them; what was declared stays readable until the next type begins.
 OPENVORLA_EXPORT void endNodeType();
 OPENVORLA_EXPORT unsigned int nodeTypeAttributeCount();

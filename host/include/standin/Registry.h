@@ -43,6 +43,11 @@ struct RegistrationInfo {
   }
 };
 
+// The VPxNode::Type of the nodes of a registered node type (registerShape:
+// kSurfaceShape, registerTransform: kTransformNode); kDependNode when none is
+// registered under the name.
+OPENVORLA_EXPORT int nodeKind(const std::string &typeName);
+
 // Every registration of the loaded plug-ins, in the order they were made.
 OPENVORLA_EXPORT std::vector<RegistrationInfo> registrations();
 
