@@ -38,6 +38,8 @@ def _exports(module: Module) -> str:
 def _constant(c: Constant) -> str:
     if isinstance(c.value, str):
         value = f'PyUnicode_DecodeUTF8({c.cpp}, sizeof({c.cpp}) - 1, "surrogateescape")'
+    elif c.make:
+        value = f'{c.make}({c.cpp})'
     else:
         value = f'PyLong_FromLong(static_cast<long>({c.cpp}))'
     return f'  swigrt::SetConstant(d, {c_string(c.name)}, {value});\n'

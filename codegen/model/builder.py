@@ -276,6 +276,13 @@ class Builder:
         for v in cls.variables:
             if not v.static or v.access != 'public':
                 continue
+            # A constant of a scalar type is a number of the class, as its
+            # enumerators are, rather than a variable to read through cvar.
+            number = conversions.constant_number(v.type)
+            if number:
+                constants.append(Constant(f'{cls.name}_{v.name}', 0, f'{cls.name}::{v.name}',
+                                          number))
+                continue
             variables.append(GlobalVariable(f'{cls.name}_{v.name}', f'{cls.name}::{v.name}',
                                             spell(unqualified(v.type)), self.descriptor_for(v.type),
                                             v.type.const))

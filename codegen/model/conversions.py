@@ -28,6 +28,14 @@ _LITERAL = re.compile(r'-?(\d+(\.\d*)?([eE]-?\d+)?[fFuUlL]*|true|false)')
 DescriptorFor = Callable[[CType], Descriptor]
 
 
+def constant_number(t: CType) -> str:
+    """The call making the Python number of a constant of this type, or ''."""
+    t = _scalar_target(t)
+    if not t.const or t.kind != 'builtin' or t.name not in SCALAR_RESULTS:
+        return ''
+    return SCALAR_RESULTS[t.name]
+
+
 def _scalar_target(t: CType) -> CType:
     """A typedef of a scalar or enumeration converts as what it names."""
     while t.kind == 'typedef' and t.inner.kind in ('builtin', 'enum', 'typedef'):

@@ -133,6 +133,7 @@ class Constant:
     name: str
     value: int | str
     cpp: str = ''                 # the enumerator or macro, "VPxNode::kDependNode"
+    make: str = ''                # the call making a number's Python value, when not a long
 
 
 @dataclass

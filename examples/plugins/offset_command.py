@@ -1,6 +1,6 @@
 """An undoable command, offsetAttr: adds an offset to a numeric attribute.
 
-    vorla.run_command('offsetAttr', 'sineNode1.input', 0.25)   # -> '0.75'
+    vorla.run_command('offsetAttr', 'sineNode1.input', 0.25)   # -> 0.75
     vorla.run_command('offsetAttr', 'sineNode1.input', 2, '-times', 3)
     vorla.undo()    # the attribute is back to its old value
     vorla.redo()
@@ -31,12 +31,12 @@ class OffsetCommand(vpx.VPxCommand):
         return syntax
 
     def doIt(self, args):
-        # The arguments come as the host passed them; the command remembers
-        # what it needs to redo and undo itself.
+        # The host has checked the arguments against the syntax; the command
+        # remembers what it needs to redo and undo itself.
         self.plug = args.asString(0)
         offset = args.asDouble(1)
-        times = args.flagIndex('-t', '-times')  # past the end when absent
-        if times < args.length():
+        times = args.flagIndex('-t', '-times')
+        if times != ov.VArgList.kInvalidArgIndex:
             offset *= args.asInt(times + 1)
         self.old = vorla.get_attr(self.plug)
         self.new = self.old + offset

@@ -261,6 +261,29 @@ PyObject *evaluation_threads(PyObject *, PyObject *) {
 
 // --- commands ---
 
+// A command's result as Python values: None, a number, a string, or a list.
+PyObject *fromResult(const standin::CommandResult &result) {
+  using standin::CommandResult;
+  auto one = [&](size_t i) -> PyObject * {
+    switch (result.kind) {
+      case CommandResult::kInt: return PyLong_FromDouble(result.numbers[i]);
+      case CommandResult::kDouble: return PyFloat_FromDouble(result.numbers[i]);
+      default: return str(result.texts[i]);
+    }
+  };
+  if (result.kind == CommandResult::kNone) Py_RETURN_NONE;
+  if (!result.isArray) return one(0);
+  const size_t n = result.kind == CommandResult::kString ? result.texts.size()
+                                                          : result.numbers.size();
+  PyObject *list = PyList_New(static_cast<Py_ssize_t>(n));
+  for (size_t i = 0; list && i < n; ++i) {
+    PyObject *item = one(i);
+    if (!item) Py_CLEAR(list);
+    else PyList_SET_ITEM(list, static_cast<Py_ssize_t>(i), item);
+  }
+  return list;
+}
+
 PyObject *run_command(PyObject *, PyObject *args) {
   Py_ssize_t count = PyTuple_GET_SIZE(args);
   if (count < 1 || !PyUnicode_Check(PyTuple_GET_ITEM(args, 0))) {
@@ -270,14 +293,22 @@ PyObject *run_command(PyObject *, PyObject *args) {
   const char *name = PyUnicode_AsUTF8(PyTuple_GET_ITEM(args, 0));
   if (!name) return nullptr;
   std::vector<standin::Value> values(static_cast<size_t>(count - 1));
-  for (Py_ssize_t i = 1; i < count; ++i)
-    if (!toValue(PyTuple_GET_ITEM(args, i), &values[static_cast<size_t>(i - 1)], "run_command"))
+  for (Py_ssize_t i = 1; i < count; ++i) {
+    PyObject *arg = PyTuple_GET_ITEM(args, i);
+    if (!PyUnicode_Check(arg) && !PyLong_Check(arg) && !PyFloat_Check(arg)) {
+      PyErr_Format(PyExc_TypeError,
+                   "run_command() takes numbers and strings as the command's arguments, not "
+                   "'%.200s'",
+                   Py_TYPE(arg)->tp_name);
       return nullptr;
-  std::string result;
+    }
+    if (!toValue(arg, &values[static_cast<size_t>(i - 1)], "run_command")) return nullptr;
+  }
+  standin::CommandResult result;
   VStatus status =
       withoutInterpreterLock([&] { return Commands::instance().run(name, values, &result); });
   if (!status) return statusResult(status);
-  return str(result);
+  return fromResult(result);
 }
 
 PyObject *undo(PyObject *, PyObject *) {
@@ -356,7 +387,8 @@ PyMethodDef kFunctions[] = {
      "evaluation_threads() -> [0, 1, ...]: the host threads that computed in the last\n"
      "evaluate(), in the order they first computed"},
     {"run_command", run_command, METH_VARARGS,
-     "run_command(name, *args) -> result text\n\nArguments are numbers and strings."},
+     "run_command(name, *args) -> result\n\nArguments are numbers and strings, checked against "
+     "the command's syntax.\nThe result is None, a number, a string, or a list of them."},
     {"undo", undo, METH_NOARGS, "undo(): undoes the last undoable command"},
     {"redo", redo, METH_NOARGS, "redo(): redoes the last undone command"},
     {"export_scene", export_scene, METH_VARARGS, "export_scene(path, translator)"},

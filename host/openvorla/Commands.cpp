@@ -15,13 +15,23 @@
 #include <standin/Graph.h>
 #include <standin/Registry.h>
 
-#include <climits>
-#include <cmath>
 #include <mutex>
 #include <utility>
 
+#include "CommandSyntax.h"
 #include "HostCalls.h"
 #include "NumberText.h"
+
+OPENVORLA_NAMESPACE_OPEN
+
+// The host's side of a command: the syntax it was registered with.
+class VPxCommandAccess {
+ public:
+  static bool hasSyntax(const VPxCommand &command) { return command.hasSyntax(); }
+  static void setSyntax(VPxCommand &command, const VSyntax &syntax) { command.fSyntax = syntax; }
+};
+
+OPENVORLA_NAMESPACE_CLOSE
 
 namespace standin {
 
@@ -43,47 +53,62 @@ void deleteCommands(const std::vector<Kept> &commands) {
   for (const Kept &k : commands) guardedVoid([&] { standin::deleteCommand(k.command); });
 }
 
-bool isInt(double number) {
-  return std::trunc(number) == number && number >= INT_MIN && number <= INT_MAX;
-}
-
-template <typename Array, typename Format>
-std::string joined(const Array &array, Format format) {
-  std::string text;
-  for (unsigned int i = 0; i < array.length(); ++i) text += (i ? " " : "") + format(array[i]);
-  return text;
-}
-
 }  // namespace
 
-std::string commandResultText() {
-  const bool array = VPxCommand::isCurrentResultArray();
+std::string CommandResult::text() const {
+  std::string out;
+  const size_t n = kind == kString ? texts.size() : numbers.size();
+  for (size_t i = 0; i < n; ++i) {
+    if (i) out += ' ';
+    if (kind == kString)
+      out += texts[i];
+    else if (kind == kInt)
+      out += std::to_string(static_cast<long long>(numbers[i]));
+    else
+      out += formatDouble(numbers[i]);
+  }
+  return out;
+}
+
+CommandResult currentCommandResult() {
+  CommandResult r;
+  r.isArray = VPxCommand::isCurrentResultArray();
   switch (VPxCommand::currentResultType()) {
     case VPxCommand::kLong:
-      if (array) {
+      r.kind = CommandResult::kInt;
+      if (r.isArray) {
         VIntArray values;
         VPxCommand::getCurrentResult(values);
-        return joined(values, [](int v) { return std::to_string(v); });
+        for (unsigned int i = 0; i < values.length(); ++i) r.numbers.push_back(values[i]);
+      } else {
+        r.numbers.push_back(VPxCommand::currentIntResult());
       }
-      return std::to_string(VPxCommand::currentIntResult());
+      break;
     case VPxCommand::kDouble:
-      if (array) {
+      r.kind = CommandResult::kDouble;
+      if (r.isArray) {
         VDoubleArray values;
         VPxCommand::getCurrentResult(values);
-        return joined(values, [](double v) { return formatDouble(v); });
+        for (unsigned int i = 0; i < values.length(); ++i) r.numbers.push_back(values[i]);
+      } else {
+        r.numbers.push_back(VPxCommand::currentDoubleResult());
       }
-      return formatDouble(VPxCommand::currentDoubleResult());
+      break;
     case VPxCommand::kString:
-      if (array) {
+      r.kind = CommandResult::kString;
+      if (r.isArray) {
         VStringArray values;
         VPxCommand::getCurrentResult(values);
-        return joined(values, [](const VString &v) { return std::string(v.asUTF8()); });
+        for (unsigned int i = 0; i < values.length(); ++i) r.texts.push_back(values[i].asUTF8());
+      } else {
+        r.texts.push_back(VPxCommand::currentStringResult().asUTF8());
       }
-      return VPxCommand::currentStringResult().asUTF8();
+      break;
     case VPxCommand::kNoArg:
+      r.isArray = false;
       break;
   }
-  return "";
+  return r;
 }
 
 struct Commands::Impl {
@@ -100,8 +125,37 @@ Commands &Commands::instance() {
   return *commands;
 }
 
+namespace {
+
+// The arguments as the command gets them: checked against its syntax when
+// it has one.
+VStatus argumentsFor(const std::string &name, VPxCommand &command, const std::vector<Value> &args,
+                     VArgList *list) {
+  VSyntax syntax;
+  bool given = false;
+  VStatus status = commandSyntax(VString(name.c_str()), &syntax, &given);
+  if (!status) return status;
+  bool check = false;
+  if (given) {
+    VPxCommandAccess::setSyntax(command, syntax);
+    status = guardedVoid([&] { check = VPxCommandAccess::hasSyntax(command); });
+    if (!status) return failed("The command " + quoted(name), status);
+  }
+  if (check) return parseCommandLine(name, syntax, args, list);
+  plainCommandLine(args, list);
+  return VStatus::kSuccess;
+}
+
+std::string commandLine(const std::string &name, const std::vector<Value> &args) {
+  std::string line = name;
+  for (const Value &v : args) line += v.isString ? " \"" + v.text + "\"" : " " + formatDouble(v.number);
+  return line;
+}
+
+}  // namespace
+
 VStatus Commands::run(const std::string &name, const std::vector<Value> &args,
-                      std::string *result) {
+                      CommandResult *result) {
   VPxCommand *command = nullptr;
   VStatus status = guardedVoid([&] { command = standin::createCommand(name.c_str()); });
   if (!command) {
@@ -112,20 +166,12 @@ VStatus Commands::run(const std::string &name, const std::vector<Value> &args,
                    "The creator of the command " + quoted(name) + " made no command");
   }
   VArgList list;
-  std::string line = name;
-  for (const Value &v : args) {
-    if (v.isString) {
-      list.addArg(VString(v.text.c_str()));
-      line += " \"" + v.text + "\"";
-    } else if (isInt(v.number)) {
-      list.addArg(static_cast<int>(v.number));
-      line += " " + std::to_string(static_cast<int>(v.number));
-    } else {
-      list.addArg(v.number);
-      line += " " + formatDouble(v.number);
-    }
+  status = argumentsFor(name, *command, args, &list);
+  if (!status) {
+    deleteCommands({{name, command}});
+    return status;
   }
-  command->setCommandString(line.c_str());
+  command->setCommandString(commandLine(name, args).c_str());
   VPxCommand::clearResult();
   status = guarded([&] { return command->doIt(list); });
   bool undoable = false;
@@ -134,7 +180,7 @@ VStatus Commands::run(const std::string &name, const std::vector<Value> &args,
     deleteCommands({{name, command}});
     return failed("The command " + quoted(name), status);
   }
-  if (result) *result = commandResultText();
+  if (result) *result = currentCommandResult();
   std::vector<Kept> cut;
   if (undoable) {
     std::lock_guard<std::mutex> guard(impl_->mutex);

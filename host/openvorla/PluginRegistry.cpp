@@ -18,12 +18,12 @@
 
 #include <algorithm>
 #include <atomic>
-
-#include "BaseAttributes.h"
 #include <cstdio>
 #include <cstring>
 #include <mutex>
 #include <string>
+
+#include "BaseAttributes.h"
 
 OPENVORLA_NAMESPACE_OPEN
 
@@ -477,6 +477,37 @@ VPxCommand *createCommand(const VString &commandName) {
     role = CallbackRole::kToolCommandCreator;
   }
   return r ? static_cast<VPxCommand *>(make(*r, *r->find(role), "VPxCommand")) : nullptr;
+}
+
+VStatus commandSyntax(const VString &commandName, VSyntax *syntax, bool *given) {
+  *given = false;
+  RegistrationPtr r = findNamed(commandName, isCommandKind);
+  if (!r)
+    r = theRegistry().find([&](const Registration &e) {
+      return e.kind == RegistrationKind::kContextCommand && e.secondName.length() &&
+             e.secondName == commandName;
+    });
+  const Callback *creator = r ? r->find(CallbackRole::kSyntaxCreator) : nullptr;
+  if (!creator) return VStatus::kSuccess;
+  if (!creator->script) {
+    *syntax = reinterpret_cast<VCreateSyntaxFunction>(creator->function)();
+    *given = true;
+    return VStatus::kSuccess;
+  }
+  const standin::ScriptCallableHooks *hooks = gHooks.load();
+  int read = hooks ? hooks->value(creator->script, "VSyntax",
+                                  [](const void *made, void *out) {
+                                    *static_cast<VSyntax *>(out) =
+                                        *static_cast<const VSyntax *>(made);
+                                  },
+                                  syntax)
+                   : 0;
+  *given = read == 1;
+  if (read < 0)
+    return VStatus(VStatus::kFailure, ("The syntax creator of the command '" +
+                                       std::string(commandName.asUTF8()) + "' failed")
+                                          .c_str());
+  return VStatus::kSuccess;
 }
 
 VPxData *createData(const VTypeId &typeId) {

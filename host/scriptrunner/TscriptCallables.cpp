@@ -24,19 +24,24 @@ class PendingError {
   PyObject *fType, *fValue, *fTraceback;
 };
 
+// The class of the package that plug-ins import, or null (no error set) when
+// the package is not loaded.
+PyObject *packageClass(const char *module, const char *cls) {
+  PyObject *name = PyUnicode_FromString(module);
+  PyObject *loaded = name ? PyImport_GetModule(name) : nullptr;
+  Py_XDECREF(name);
+  PyObject *found = loaded ? PyObject_GetAttrString(loaded, cls) : nullptr;
+  Py_XDECREF(loaded);
+  if (!found) PyErr_Clear();
+  return found;
+}
+
 // Whether `instance` is of the plug-in class `base`, as the package that
 // plug-ins import defines it: 1 if it is, 0 with TypeError set if it is not,
 // -1 when the package is not loaded and cannot tell.
 int isOfBase(PyObject *instance, const char *base) {
-  PyObject *name = PyUnicode_FromString("openvorla.OpenVorlaVPx");
-  PyObject *module = name ? PyImport_GetModule(name) : nullptr;
-  Py_XDECREF(name);
-  PyObject *cls = module ? PyObject_GetAttrString(module, base) : nullptr;
-  Py_XDECREF(module);
-  if (!cls) {
-    PyErr_Clear();
-    return -1;
-  }
+  PyObject *cls = packageClass("openvorla.OpenVorlaVPx", base);
+  if (!cls) return -1;
   int is = PyObject_IsInstance(instance, cls);
   Py_DECREF(cls);
   if (is == 0)
@@ -120,7 +125,30 @@ void release(PyObject *object) {
 void *hold() { return new TpythonLock; }
 void unhold(void *held) { delete static_cast<TpythonLock *>(held); }
 
-const standin::ScriptCallableHooks kHooks{&create, &run, &release, &hold, &unhold};
+int value(PyObject *callable, const char *cls, void (*read)(const void *, void *),
+          void *context) {
+  TpythonLock lock;
+  if (callable == Py_None) return 0;
+  PendingError pending;
+  PyObject *made = PyObject_CallNoArgs(callable);
+  PyObject *type = made ? packageClass("openvorla.OpenVorla", cls) : nullptr;
+  void *address = nullptr;
+  if (made && (!type || PyObject_IsInstance(made, type) != 1)) {
+    if (!PyErr_Occurred())
+      PyErr_Format(PyExc_TypeError, "a %s creator must return a %s, not '%.200s'", cls, cls,
+                   Py_TYPE(made)->tp_name);
+  } else if (made) {
+    address = addressOf(made, true);
+  }
+  if (address) read(address, context);
+  Py_XDECREF(type);
+  Py_XDECREF(made);
+  if (address) return 1;
+  TpythonInterpreter::interpreter().catchAndReportException();
+  return -1;
+}
+
+const standin::ScriptCallableHooks kHooks{&create, &run, &release, &hold, &unhold, &value};
 
 // Installed while the engine is loaded.
 struct Installation {

@@ -169,10 +169,10 @@ PyObject *command_run(PyObject *, PyObject *args) {
   std::vector<Value> values(n - 1);
   for (Py_ssize_t i = 1; i < n; ++i)
     if (!ToValue(PyTuple_GET_ITEM(args, i), &values[i - 1])) return nullptr;
-  std::string result;
+  standin::CommandResult result;
   VStatus status =
       withoutLock([&] { return standin::Commands::instance().run(name, values, &result); });
-  return Result(status, status ? PyUnicode_FromString(result.c_str()) : Py_None);
+  return Result(status, status ? PyUnicode_FromString(result.text().c_str()) : Py_None);
 }
 
 PyObject *command_undo(PyObject *, PyObject *) {

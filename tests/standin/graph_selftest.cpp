@@ -477,11 +477,11 @@ void testCommands() {
   Commands &c = Commands::instance();
   c.flush();
   long alive = standin::aliveCount("VPxCommand");
-  std::string result;
+  standin::CommandResult result;
   CHECK(c.run("describe", {string("a b"), number(2), number(0.5)}, &result) &&
-        result == "describe \"a b\" 2 0.5" && standin::aliveCount("VPxCommand") == alive);
-  CHECK(c.run("accumulate", {number(5)}, &result) && result == "5");
-  CHECK(c.run("accumulate", {number(3)}, &result) && result == "8");
+        result.text() == "describe \"a b\" 2 0.5" && standin::aliveCount("VPxCommand") == alive);
+  CHECK(c.run("accumulate", {number(5)}, &result) && result.text() == "5");
+  CHECK(c.run("accumulate", {number(3)}, &result) && result.text() == "8");
   CHECK(standin::aliveCount("VPxCommand") == alive + 2);
   CHECK(c.undo() && gTotal == 5 && c.undo() && gTotal == 0);
   VStatus status = c.undo();
@@ -505,9 +505,9 @@ void testCommands() {
 
   VPxCommand::setResult(2.5);
   VPxCommand::appendToResult(-1.0);
-  CHECK(standin::commandResultText() == "2.5 -1");
+  CHECK(standin::currentCommandResult().text() == "2.5 -1");
   VPxCommand::clearResult();
-  CHECK(standin::commandResultText() == "");
+  CHECK(standin::currentCommandResult().text() == "");
 }
 
 // Writes "scene" to its file and reads it back; "writeOnly" fails to write.

@@ -89,6 +89,7 @@ protected:
   bool isHistoryOn(VStatus *ReturnStatus = NULL) const;
 
 private:
+  friend class VPxCommandAccess;
   bool fUndoable;
   bool fHistoryOn;
   VString fCommandString;

@@ -73,6 +73,7 @@ public:
   VArgType argType(unsigned int index) const;  // kInvalidArgType past the end
 
 private:
+  friend class VSyntaxParser;
   struct Flag {
     VString shortName;
     VString longName;

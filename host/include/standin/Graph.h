@@ -78,15 +78,29 @@ class OPENVORLA_EXPORT Graph {
   Impl *impl_;
 };
 
+// What a command set as its result: one value or an array of them.
+struct OPENVORLA_EXPORT CommandResult {
+  enum Kind { kNone, kInt, kDouble, kString } kind = kNone;
+  bool isArray = false;
+  std::vector<double> numbers;     // kInt, kDouble
+  std::vector<std::string> texts;  // kString
+  // As text: a number as the shortest text that reads back as it, the
+  // elements of an array separated by single blanks, "" for no result.
+  std::string text() const;
+};
+
 // Commands: made through the registry, run, and kept for undo and redo when
 // they are undoable.
 class OPENVORLA_EXPORT Commands {
  public:
   static Commands &instance();
-  // Runs the command with its arguments (each a string, integer, double or
-  // bool, passed in a VArgList). The command's result comes back as text.
+  // Runs the command with its arguments (numbers and strings), passed in a
+  // VArgList. When the command has a syntax (its registration's syntax
+  // creator made one and its hasSyntax() is true) the arguments are checked
+  // and converted against it first, and a misuse fails before the command's
+  // doIt runs.
   OPENVORLA_NAMESPACE::VStatus run(const std::string &name, const std::vector<Value> &args,
-                                   std::string *result);
+                                   CommandResult *result);
   OPENVORLA_NAMESPACE::VStatus undo();
   OPENVORLA_NAMESPACE::VStatus redo();
   // Deletes the commands kept for undo and redo.
@@ -98,10 +112,8 @@ class OPENVORLA_EXPORT Commands {
   Impl *impl_;
 };
 
-// The current command result as text: a number as the shortest text that
-// reads back as it, the elements of an array separated by single blanks, ""
-// for no result.
-OPENVORLA_EXPORT std::string commandResultText();
+// The current command result.
+OPENVORLA_EXPORT CommandResult currentCommandResult();
 
 // Scene files through registered file translators: the translator's writer
 // and reader run with the file named by `path`.

@@ -66,6 +66,12 @@ OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VStatus initializeNode(
 // A new command of a registered command, constraint command or tool command.
 OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxCommand *createCommand(
     const OPENVORLA_NAMESPACE::VString &commandName);
+// The syntax the command's syntax creator makes: `given` false when it was
+// registered without one (or with None). A failing syntax creator is
+// kFailure, its failure in the log.
+OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VStatus commandSyntax(
+    const OPENVORLA_NAMESPACE::VString &commandName, OPENVORLA_NAMESPACE::VSyntax *syntax,
+    bool *given);
 OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxData *createData(
     const OPENVORLA_NAMESPACE::VTypeId &typeId);
 OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxData *createData(

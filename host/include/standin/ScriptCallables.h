@@ -26,6 +26,13 @@ struct ScriptCallableHooks {
   // still lets other threads run.
   void *(*hold)();
   void (*unhold)(void *held);
+  // Calls the object with no arguments; what it returns must be an instance
+  // of the value class `cls` of the openvorla package ("VSyntax"), whose C++
+  // object `read` is given (with `context`) while the instance lives. 1 when
+  // read; 0 when the object is None, a callback left out; -1, the failure
+  // reported, when the call raised or returned something else.
+  int (*value)(PyObject *callable, const char *cls, void (*read)(const void *object, void *context),
+               void *context);
 };
 
 // The interpreter lock held for a run of script calls, while it lives; does
