@@ -8,11 +8,14 @@ values as lines of text.
     set sineNode1.output 0.958851077208406
 
     vorla.export_scene('scene.vtx', 'vorlaText')
+    vorla.export_scene('scene.vtx', 'vorlaText', {'precision': 4})
     vorla.import_scene('scene.vtx', 'vorlaText')
 
 Values are JSON: numbers, and strings in double quotes. Every attribute is
 written; reading sets those the graph lets it set, and the graph computes
-the others again from them.
+the others again from them. The option `precision` (registered as 17, the
+digits that keep every double exact) is the significant digits of the
+numbers written.
 """
 import json
 
@@ -21,6 +24,21 @@ import vorla
 from openvorla import OpenVorlaVPx as vpx
 
 HEADER = 'vorla-text 1'
+OPTIONS = 'precision=17'
+
+
+def parse_options(options):
+    """'name=value;...' as a dict: the registered defaults, each replaced
+    by what the script passed."""
+    return dict(part.partition('=')[::2] for part in options.split(';') if part)
+
+
+def rounded(value, digits):
+    if isinstance(value, float):
+        return float(f'{value:.{digits}g}')
+    if isinstance(value, list):
+        return [rounded(v, digits) for v in value]
+    return value
 
 
 class TextTranslator(vpx.VPxFileTranslator):
@@ -42,12 +60,13 @@ class TextTranslator(vpx.VPxFileTranslator):
         return vpx.VPxFileTranslator.kNotMyFileType
 
     def writer(self, file, options, mode):
+        digits = int(parse_options(options)['precision'])
         lines = [HEADER]
         for node, node_type, _ in vorla.nodes():
             lines.append(f'node {node_type} {node}')
             for attribute in vorla.attributes(node):
                 plug = f'{node}.{attribute}'
-                lines.append(f'set {plug} {json.dumps(vorla.get_attr(plug))}')
+                lines.append(f'set {plug} {json.dumps(rounded(vorla.get_attr(plug), digits))}')
         with open(file.rawFullName(), 'w', encoding='utf-8') as out:
             out.write('\n'.join(lines) + '\n')
         # Returning None is success; an exception fails the export and is
@@ -81,7 +100,7 @@ def create():
 
 def initializePlugin(obj):
     plugin = vpx.VFnPlugin(obj, 'Vorla Examples', '1.0')
-    plugin.registerFileTranslator(TextTranslator.name, None, create)
+    plugin.registerFileTranslator(TextTranslator.name, None, create, None, OPTIONS)
 
 
 def uninitializePlugin(obj):

@@ -321,16 +321,59 @@ PyObject *redo(PyObject *, PyObject *) {
 
 // --- files and data ---
 
-PyObject *export_scene(PyObject *, PyObject *args) {
-  const char *path, *translator;
-  if (!PyArg_ParseTuple(args, "ss:export_scene", &path, &translator)) return nullptr;
-  return statusResult(withoutInterpreterLock([&] { return Files::exportScene(path, translator); }));
+// A translator's options: "name=value;..." text, or a dict of them (True
+// and False as 1 and 0).
+bool optionsText(PyObject *given, const char *function, std::string *text) {
+  if (!given || given == Py_None) return true;
+  if (PyUnicode_Check(given)) {
+    const char *utf8 = PyUnicode_AsUTF8(given);
+    if (utf8) *text = utf8;
+    return utf8 != nullptr;
+  }
+  if (!PyDict_Check(given)) {
+    PyErr_Format(PyExc_TypeError, "%s() takes options as a str or a dict, not '%.200s'", function,
+                 Py_TYPE(given)->tp_name);
+    return false;
+  }
+  Py_ssize_t at = 0;
+  PyObject *key, *value;
+  while (PyDict_Next(given, &at, &key, &value)) {
+    PyObject *shown = PyBool_Check(value) ? PyUnicode_FromString(value == Py_True ? "1" : "0")
+                                          : PyObject_Str(value);
+    const char *name = PyUnicode_Check(key) ? PyUnicode_AsUTF8(key) : nullptr;
+    const char *utf8 = shown ? PyUnicode_AsUTF8(shown) : nullptr;
+    if (!name && !PyErr_Occurred())
+      PyErr_Format(PyExc_TypeError, "%s() takes option names as str, not '%.200s'", function,
+                   Py_TYPE(key)->tp_name);
+    if (name && utf8) *text += std::string(text->empty() ? "" : ";") + name + "=" + utf8;
+    Py_XDECREF(shown);
+    if (!name || !utf8) return false;
+  }
+  return true;
 }
 
-PyObject *import_scene(PyObject *, PyObject *args) {
+// export_scene and import_scene.
+PyObject *transferScene(PyObject *args, PyObject *kwargs, bool write) {
+  static const char *keywords[] = {"path", "translator", "options", nullptr};
   const char *path, *translator;
-  if (!PyArg_ParseTuple(args, "ss:import_scene", &path, &translator)) return nullptr;
-  return statusResult(withoutInterpreterLock([&] { return Files::importScene(path, translator); }));
+  PyObject *given = nullptr;
+  if (!PyArg_ParseTupleAndKeywords(args, kwargs, write ? "ss|O:export_scene" : "ss|O:import_scene",
+                                   const_cast<char **>(keywords), &path, &translator, &given))
+    return nullptr;
+  std::string options;
+  if (!optionsText(given, write ? "export_scene" : "import_scene", &options)) return nullptr;
+  return statusResult(withoutInterpreterLock([&] {
+    return write ? Files::exportScene(path, translator, options)
+                 : Files::importScene(path, translator, options);
+  }));
+}
+
+PyObject *export_scene(PyObject *, PyObject *args, PyObject *kwargs) {
+  return transferScene(args, kwargs, true);
+}
+
+PyObject *import_scene(PyObject *, PyObject *args, PyObject *kwargs) {
+  return transferScene(args, kwargs, false);
 }
 
 PyObject *round_trip_data(PyObject *, PyObject *args) {
@@ -391,8 +434,13 @@ PyMethodDef kFunctions[] = {
      "the command's syntax.\nThe result is None, a number, a string, or a list of them."},
     {"undo", undo, METH_NOARGS, "undo(): undoes the last undoable command"},
     {"redo", redo, METH_NOARGS, "redo(): redoes the last undone command"},
-    {"export_scene", export_scene, METH_VARARGS, "export_scene(path, translator)"},
-    {"import_scene", import_scene, METH_VARARGS, "import_scene(path, translator)"},
+    {"export_scene", withKeywords(export_scene), METH_VARARGS | METH_KEYWORDS,
+     "export_scene(path, translator, options=None)\n\nWrites the scene with the translator. "
+     "options: 'name=value;...' or a dict;\neach replaces the translator's default of that "
+     "name."},
+    {"import_scene", withKeywords(import_scene), METH_VARARGS | METH_KEYWORDS,
+     "import_scene(path, translator, options=None)\n\nReads the file with the translator; "
+     "options as for export_scene."},
     {"round_trip_data", round_trip_data, METH_VARARGS,
      "round_trip_data(type_name, text) -> (written, copied)\n\nMakes the data type, reads "
      "it from the text, copies it and writes\nboth back."},

@@ -7,6 +7,10 @@
 #include <standin/Graph.h>
 #include <standin/Registry.h>
 
+#include <algorithm>
+#include <utility>
+#include <vector>
+
 #include "HostCalls.h"
 
 namespace standin {
@@ -20,7 +24,26 @@ using host::quoted;
 
 namespace {
 
-VStatus transfer(const std::string &path, const std::string &name, bool write) {
+// "a=1;b=2" as its pairs in order; a part without '=' is a name alone.
+std::vector<std::pair<std::string, std::string>> pairsOf(const std::string &options) {
+  std::vector<std::pair<std::string, std::string>> pairs;
+  size_t start = 0;
+  while (start <= options.size()) {
+    size_t end = options.find(';', start);
+    if (end == std::string::npos) end = options.size();
+    std::string part = options.substr(start, end - start);
+    if (!part.empty()) {
+      size_t equals = part.find('=');
+      pairs.emplace_back(part.substr(0, equals),
+                         equals == std::string::npos ? "" : part.substr(equals));
+    }
+    start = end + 1;
+  }
+  return pairs;
+}
+
+VStatus transfer(const std::string &path, const std::string &name, const std::string &options,
+                 bool write) {
   if (path.empty()) return failure(VStatus::kInvalidParameter, "A scene file needs a path");
   VPxFileTranslator *translator = nullptr;
   VStatus status = guardedVoid([&] { translator = standin::createTranslator(name.c_str()); });
@@ -45,9 +68,10 @@ VStatus transfer(const std::string &path, const std::string &name, bool write) {
     const VPxFileTranslator::FileAccessMode mode =
         write ? VPxFileTranslator::kExportAccessMode : VPxFileTranslator::kImportAccessMode;
     standin::setFileAccessMode(mode);
+    const VString given(
+        Files::mergeOptions(translatorDefaultOptions(name.c_str()), options).c_str());
     status = guarded([&] {
-      return write ? translator->writer(file, VString(), mode)
-                   : translator->reader(file, VString(), mode);
+      return write ? translator->writer(file, given, mode) : translator->reader(file, given, mode);
     });
     standin::setFileAccessMode(VPxFileTranslator::kUnknownAccessMode);
     if (!status)
@@ -61,12 +85,29 @@ VStatus transfer(const std::string &path, const std::string &name, bool write) {
 
 }  // namespace
 
-VStatus Files::exportScene(const std::string &path, const std::string &translator) {
-  return transfer(path, translator, true);
+std::string Files::mergeOptions(const std::string &defaults, const std::string &options) {
+  auto merged = pairsOf(defaults);
+  for (const auto &pair : pairsOf(options)) {
+    auto same = std::find_if(merged.begin(), merged.end(),
+                             [&](const auto &p) { return p.first == pair.first; });
+    if (same != merged.end())
+      same->second = pair.second;
+    else
+      merged.push_back(pair);
+  }
+  std::string text;
+  for (const auto &pair : merged) text += (text.empty() ? "" : ";") + pair.first + pair.second;
+  return text;
 }
 
-VStatus Files::importScene(const std::string &path, const std::string &translator) {
-  return transfer(path, translator, false);
+VStatus Files::exportScene(const std::string &path, const std::string &translator,
+                           const std::string &options) {
+  return transfer(path, translator, options, true);
+}
+
+VStatus Files::importScene(const std::string &path, const std::string &translator,
+                           const std::string &options) {
+  return transfer(path, translator, options, false);
 }
 
 }  // namespace standin

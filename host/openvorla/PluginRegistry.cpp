@@ -524,6 +524,13 @@ VPxData *createData(const VString &typeName) {
   return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator), "VPxData")) : nullptr;
 }
 
+std::string translatorDefaultOptions(const VString &translatorName) {
+  RegistrationPtr r = findNamed(translatorName, [](RegistrationKind k) {
+    return k == RegistrationKind::kFileTranslator;
+  });
+  return r ? r->defaultOptions.asUTF8() : "";
+}
+
 VPxFileTranslator *createTranslator(const VString &translatorName) {
   RegistrationPtr r = findNamed(translatorName, [](RegistrationKind k) {
     return k == RegistrationKind::kFileTranslator;

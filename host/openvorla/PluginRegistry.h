@@ -92,6 +92,7 @@ class Registration {
   const VString name;
   VString secondName;
   VString classification;
+  VString defaultOptions;  // a file translator's
   unsigned int typeId = 0;
   unsigned int secondTypeId = 0;
   int flags = 0;

@@ -280,10 +280,12 @@ VStatus VFnPlugin::unregisterTopologyEvaluator(const VString &evaluatorName) {
 
 VStatus VFnPlugin::registerFileTranslator(const VString &translatorName, const char *,
                                           VCreatorFunction creatorFunction, const char *,
-                                          const char *, bool requiresFullScript,
+                                          const char *defaultOptionsString,
+                                          bool requiresFullScript,
                                           const VString &dataStorageLocation) {
   RegistrationPtr r = start(K::kFileTranslator, translatorName);
   r->secondName = dataStorageLocation;
+  if (defaultOptionsString) r->defaultOptions = defaultOptionsString;
   r->flags = requiresFullScript;
   r->add(R::kCreator, creatorFunction);
   return submitRegistration(object(), r);

@@ -134,10 +134,24 @@ def test_text_translator_writes_the_scene_and_reads_it_back(vorla, tmp_path):
         print(vorla.log()[-1].splitlines()[-1])
         for name, _, _ in vorla.nodes():
             vorla.delete_node(name)
+        vorla.create_node('sineNode', 'wave')
+        vorla.set_attr('wave.input', 0.5)
+        for options in ({{'precision': 3}}, 'precision=5;comment=x', None, 7):
+            try:
+                vorla.export_scene({str(scene)!r} + '2', 'vorlaText', options)
+                print(open({str(scene)!r} + '2').read().splitlines()[4])
+            except TypeError as e:
+                print(e)
+        for name, _, _ in vorla.nodes():
+            vorla.delete_node(name)
         print(vorla.alive('VPxFileTranslator') - before[1][3])
         ''')
     assert scene.read_text().splitlines()[:5] == [
         'vorla-text 1', 'node sineNode wave', 'set wave.input 0.25', 'set wave.amplitude -2.0',
         'set wave.output -0.4948079185090459']
     assert lines[:2] == ["[('wave', 'sineNode', 0)]", 'True']
-    assert lines[3:] == ["ValueError: line 6: cannot read 'frobnicate'", '0']
+    assert lines[3:] == ["ValueError: line 6: cannot read 'frobnicate'",
+                         # The options passed replace the registered precision=17.
+                         'set wave.output 0.479', 'set wave.output 0.47943',
+                         'set wave.output 0.479425538604203',
+                         "export_scene() takes options as a str or a dict, not 'int'", '0']

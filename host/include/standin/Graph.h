@@ -116,13 +116,20 @@ class OPENVORLA_EXPORT Commands {
 OPENVORLA_EXPORT CommandResult currentCommandResult();
 
 // Scene files through registered file translators: the translator's writer
-// and reader run with the file named by `path`.
+// and reader run with the file named by `path` and the options: the
+// "name=value" pairs, separated by ';', that the translator was registered
+// with, each replaced by the one of that name in `options`, and the others
+// of `options` after them.
 class OPENVORLA_EXPORT Files {
  public:
   static OPENVORLA_NAMESPACE::VStatus exportScene(const std::string &path,
-                                                  const std::string &translator);
+                                                  const std::string &translator,
+                                                  const std::string &options = "");
   static OPENVORLA_NAMESPACE::VStatus importScene(const std::string &path,
-                                                  const std::string &translator);
+                                                  const std::string &translator,
+                                                  const std::string &options = "");
+  // The options as the translator gets them.
+  static std::string mergeOptions(const std::string &defaults, const std::string &options);
 };
 
 // A registered data type exercised as the application does: made through its

@@ -78,6 +78,9 @@ OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxData *createData(
     const OPENVORLA_NAMESPACE::VString &typeName);
 OPENVORLA_EXPORT OPENVORLA_NAMESPACE::VPxFileTranslator *createTranslator(
     const OPENVORLA_NAMESPACE::VString &translatorName);
+// The options a file translator was registered with; "" for none.
+OPENVORLA_EXPORT std::string translatorDefaultOptions(
+    const OPENVORLA_NAMESPACE::VString &translatorName);
 
 // Deletion as the host does it: through the virtual destructor, without the
 // interpreter lock.
