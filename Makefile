@@ -48,7 +48,8 @@ test-asan: build-asan
 	ASAN_OPTIONS=detect_leaks=0:abort_on_error=1 $(ASAN_BUILD)/bin/vorla \
 	  $(foreach p,$(EXAMPLES),--plugin examples/plugins/$(p).py) examples/scenes/demo.py >/dev/null
 
-EXAMPLES := sine_node offset_command vector_data text_translator
+EXAMPLES := sine_node offset_command vector_data text_translator wave_deformer \
+            marker_locator snap_transform scatter_command
 
 demo: build
 	$(BUILD)/bin/vorla $(foreach p,$(EXAMPLES),--plugin examples/plugins/$(p).py) \

@@ -3,7 +3,11 @@
     vorla --plugin examples/plugins/sine_node.py \\
           --plugin examples/plugins/offset_command.py \\
           --plugin examples/plugins/vector_data.py \\
-          --plugin examples/plugins/text_translator.py examples/scenes/demo.py
+          --plugin examples/plugins/text_translator.py \\
+          --plugin examples/plugins/wave_deformer.py \\
+          --plugin examples/plugins/marker_locator.py \\
+          --plugin examples/plugins/snap_transform.py \\
+          --plugin examples/plugins/scatter_command.py examples/scenes/demo.py
 """
 import math
 import os
@@ -114,9 +118,53 @@ def show_threads(count=200, threads=4):
     print(f'compute calls: {computes} ({count} nodes, evaluated twice)')
 
 
+def show_deformer():
+    heading('waveDeformer: points moved along a sine wave, with numpy')
+    node = vorla.create_node('waveDeformer')
+    vorla.set_attr(node + '.inputGeom', [[x / 4, 0, 0] for x in range(5)])
+    vorla.set_attr(node + '.amplitude', 0.5)
+    print(f'{node}.outputGeom y: {[round(y, 3) + 0.0 for _, y, _ in vorla.get_attr(node + ".outputGeom")]}')
+    vorla.set_attr(node + '.envelope', 0.5)
+    print(f'envelope 0.5:          {[round(y, 3) + 0.0 for _, y, _ in vorla.get_attr(node + ".outputGeom")]}')
+    vorla.delete_node(node)
+
+
+def show_locator_and_transform():
+    heading('marker and snapTransform: the host asks for their box and matrix')
+    marker = vorla.create_node('marker')
+    vorla.set_attr(marker + '.localPosition', [1, 0, 2])
+    vorla.set_attr(marker + '.localScale', [2, 2, 2])
+    print(f'{marker} at [1, 0, 2], scale 2: box {vorla.get_attr(marker + ".nodeBoundingBoxMin")}'
+          f' .. {vorla.get_attr(marker + ".nodeBoundingBoxMax")}')
+    snap = vorla.create_node('snapTransform')
+    vorla.set_attr(snap + '.translate', [1.2, 0.3, -0.8])
+    print(f'{snap}.translate = [1.2, 0.3, -0.8]: matrix translation '
+          f'{vorla.get_attr(snap + ".matrix")[3][:3]}  (snapped to half units)')
+    vorla.delete_node(marker)
+    vorla.delete_node(snap)
+
+
+def show_scatter():
+    heading('scatter: a command with flags, checked by the host')
+    made = vorla.run_command('scatter', 'sineNode', '-count', 4, '-seed', 1,
+                             '-attribute', 'input', '-range', 0, 3.14, '-prefix', 'dot')
+    print(f'scatter sineNode -count 4 -seed 1 -attribute input -range 0 3.14 -prefix dot'
+          f'\n  -> {made}')
+    print('  inputs:', [round(vorla.get_attr(n + '.input'), 3) for n in made])
+    vorla.undo()
+    print('undo ->', [n for n, _, _ in vorla.nodes() if n.startswith('dot')])
+    try:
+        vorla.run_command('scatter', 'sineNode', '-count', 'four')
+    except RuntimeError as refused:
+        print(f'scatter sineNode -count four -> {refused}')
+
+
 show_registrations()
 node = show_sine_nodes()
 show_command(node)
 show_data()
 show_translator()
+show_deformer()
+show_locator_and_transform()
+show_scatter()
 show_threads()

@@ -28,6 +28,9 @@ ov::VObject matrix(const char *name, const char *brief, bool computed);
 struct Declared {
   std::vector<ov::VObject> attributes;
   std::vector<std::pair<ov::VObject, ov::VObject>> affects;
+  // Outputs that the host asks the node itself for (a locator's bounding
+  // box): every other attribute of the node affects them.
+  std::vector<ov::VObject> askedOfNode;
 };
 
 // What the nodes of a VPxNode::Type have before the plug-in's own attributes.
@@ -35,7 +38,8 @@ Declared ofKind(int nodeKind);
 
 // The host's value of a base attribute, computed for a node whose compute
 // answered kUnknownParameter: a geometry filter's output through its
-// deform(), a transform's matrix through its transformation matrix.
+// deform(), a transform's matrix through its transformation matrix, a
+// locator's bounding box through its boundingBox().
 // kUnknownParameter when the host has none for the attribute. No lock held.
 ov::VStatus compute(graph::Node &node, int attribute);
 

@@ -7,6 +7,7 @@
 #include <openvorla/VFnData.h>
 #include <openvorla/VFnNumericData.h>
 
+#include <algorithm>
 #include <cctype>
 #include <set>
 #include <utility>
@@ -181,6 +182,11 @@ std::shared_ptr<const NodeType> GraphState::nodeType(const std::string &typeName
     if (type->find(object) < 0) type->attributes.push_back(specOf(object));
   for (const VObject &object : declared.attributes)
     if (type->find(object) < 0) type->attributes.push_back(specOf(object));
+  for (const VObject &output : base.askedOfNode)
+    for (const AttributeSpec &spec : type->attributes)
+      if (std::find(base.askedOfNode.begin(), base.askedOfNode.end(), spec.object) ==
+          base.askedOfNode.end())
+        declared.affects.push_back({spec.object, output});
   declared.affects.insert(declared.affects.end(), base.affects.begin(), base.affects.end());
   for (const auto &affects : declared.affects) {
     int from = type->find(affects.first), to = type->find(affects.second);

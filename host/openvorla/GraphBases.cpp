@@ -45,12 +45,37 @@ VStatus deformed(graph::Node &node, VPxGeometryFilter &filter, int output) {
   return VStatus::kSuccess;
 }
 
+// A three-number attribute of the node as a vector.
+VVector component(graph::Node &node, const VObject &attribute, double otherwise) {
+  int a = node.type->find(attribute);
+  std::vector<double> n =
+      a < 0 ? std::vector<double>() : numbersOf(*node.slots[a], VFnData::kNumeric);
+  return n.size() == 3 ? VVector(n[0], n[1], n[2]) : VVector(otherwise, otherwise, otherwise);
+}
+
+// The locator's box, scaled by its local scale and moved to its local
+// position; a point at its position when it is not bounded.
+VStatus bounded(graph::Node &node, VPxLocatorNode &locator) {
+  VVector at = component(node, VPxLocatorNode::localPosition, 0.0);
+  VVector scale = component(node, VPxLocatorNode::localScale, 1.0);
+  VPoint low(at.x, at.y, at.z), high = low;
+  if (locator.isBounded()) {
+    VBoundingBox box = locator.boundingBox();
+    VPoint a = box.min(), b = box.max();
+    low = VPoint(at.x + a.x * scale.x, at.y + a.y * scale.y, at.z + a.z * scale.z);
+    high = VPoint(at.x + b.x * scale.x, at.y + b.y * scale.y, at.z + b.z * scale.z);
+  }
+  for (const auto &[attribute, p] : {std::make_pair(VPxLocatorNode::nodeBoundingBoxMin, low),
+                                     std::make_pair(VPxLocatorNode::nodeBoundingBoxMax, high)}) {
+    int slot = node.type->find(attribute);
+    if (slot >= 0) node.slots[slot]->setNumbers(VFnData::kNumeric, {p.x, p.y, p.z}, true);
+  }
+  return VStatus::kSuccess;
+}
+
 VStatus composed(graph::Node &node, VPxTransform &transform, int output) {
   auto component = [&](const VObject &attribute, double otherwise) {
-    int a = node.type->find(attribute);
-    std::vector<double> n =
-        a < 0 ? std::vector<double>() : numbersOf(*node.slots[a], VFnData::kNumeric);
-    return n.size() == 3 ? VVector(n[0], n[1], n[2]) : VVector(otherwise, otherwise, otherwise);
+    return standin::bases::component(node, attribute, otherwise);
   };
   VPxTransformationMatrix &m = transform.transformationMatrix();
   VVector r = component(VPxTransform::rotate, 0.0);
@@ -107,15 +132,20 @@ Declared ofKind(int nodeKind) {
       return {{VPxGeometryFilter::inputGeom, VPxGeometryFilter::envelope,
                VPxGeometryFilter::outputGeom},
               {{VPxGeometryFilter::inputGeom, VPxGeometryFilter::outputGeom},
-               {VPxGeometryFilter::envelope, VPxGeometryFilter::outputGeom}}};
+               {VPxGeometryFilter::envelope, VPxGeometryFilter::outputGeom}},
+              {}};
     case VPxNode::kTransformNode:
       return {{VPxTransform::translate, VPxTransform::rotate, VPxTransform::scale,
                VPxTransform::matrix},
               {{VPxTransform::translate, VPxTransform::matrix},
                {VPxTransform::rotate, VPxTransform::matrix},
-               {VPxTransform::scale, VPxTransform::matrix}}};
+               {VPxTransform::scale, VPxTransform::matrix}},
+              {}};
     case VPxNode::kLocatorNode:
-      return {{VPxLocatorNode::localPosition, VPxLocatorNode::localScale}, {}};
+      return {{VPxLocatorNode::localPosition, VPxLocatorNode::localScale,
+               VPxLocatorNode::nodeBoundingBoxMin, VPxLocatorNode::nodeBoundingBoxMax},
+              {},
+              {VPxLocatorNode::nodeBoundingBoxMin, VPxLocatorNode::nodeBoundingBoxMax}};
     default:
       return {};
   }
@@ -129,6 +159,8 @@ VStatus compute(graph::Node &node, int attribute) {
   if (object == VPxTransform::matrix)
     if (auto *transform = dynamic_cast<VPxTransform *>(node.node))
       return composed(node, *transform, attribute);
+  if (object == VPxLocatorNode::nodeBoundingBoxMin || object == VPxLocatorNode::nodeBoundingBoxMax)
+    if (auto *locator = dynamic_cast<VPxLocatorNode *>(node.node)) return bounded(node, *locator);
   return VStatus::kUnknownParameter;
 }
 

@@ -54,7 +54,7 @@ VObject VPxLocatorNode::localScaleY = standin::makeAttribute("VPxLocatorNode.loc
 VObject VPxLocatorNode::localScaleZ = standin::makeAttribute("VPxLocatorNode.localScaleZ");
 VObject VPxLocatorNode::nodeBoundingBox = standin::makeAttribute("VPxLocatorNode.nodeBoundingBox");
 VObject VPxLocatorNode::nodeBoundingBoxMin =
-    standin::makeAttribute("VPxLocatorNode.nodeBoundingBoxMin");
+    standin::bases::triple("nodeBoundingBoxMin", "nbim", 0.0);
 VObject VPxLocatorNode::nodeBoundingBoxMinX =
     standin::makeAttribute("VPxLocatorNode.nodeBoundingBoxMinX");
 VObject VPxLocatorNode::nodeBoundingBoxMinY =
@@ -62,7 +62,7 @@ VObject VPxLocatorNode::nodeBoundingBoxMinY =
 VObject VPxLocatorNode::nodeBoundingBoxMinZ =
     standin::makeAttribute("VPxLocatorNode.nodeBoundingBoxMinZ");
 VObject VPxLocatorNode::nodeBoundingBoxMax =
-    standin::makeAttribute("VPxLocatorNode.nodeBoundingBoxMax");
+    standin::bases::triple("nodeBoundingBoxMax", "nbia", 0.0);
 VObject VPxLocatorNode::nodeBoundingBoxMaxX =
     standin::makeAttribute("VPxLocatorNode.nodeBoundingBoxMaxX");
 VObject VPxLocatorNode::nodeBoundingBoxMaxY =

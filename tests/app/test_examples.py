@@ -155,3 +155,64 @@ def test_text_translator_writes_the_scene_and_reads_it_back(vorla, tmp_path):
                          'set wave.output 0.479', 'set wave.output 0.47943',
                          'set wave.output 0.479425538604203',
                          "export_scene() takes options as a str or a dict, not 'int'", '0']
+
+
+def test_wave_deformer_moves_points_with_numpy_on_host_threads(vorla):
+    lines = run(vorla, ['wave_deformer.py'], '''
+        nodes = [vorla.create_node('waveDeformer') for _ in range(8)]
+        for i, node in enumerate(nodes):
+            vorla.set_attr(node + '.inputGeom', [[x / 4, i, 0] for x in range(5)])
+            vorla.set_attr(node + '.amplitude', 0.5)
+        vorla.evaluate(threads=4)
+        print([[round(y, 6) for _, y, _ in vorla.get_attr(n + '.outputGeom')] for n in nodes[:2]])
+        vorla.set_attr(nodes[0] + '.envelope', 0.5)
+        vorla.set_attr(nodes[0] + '.wavelength', 2.0)
+        print([round(y, 6) for _, y, _ in vorla.get_attr(nodes[0] + '.outputGeom')])
+        ''')
+    assert lines[:2] == ['[[0.0, 0.5, 0.0, -0.5, -0.0], [1.0, 1.5, 1.0, 0.5, 1.0]]',
+                         '[0.0, 0.176777, 0.25, 0.176777, 0.0]']
+
+
+def test_marker_locator_and_snap_transform_give_the_host_their_box_and_matrix(vorla):
+    lines = run(vorla, ['marker_locator.py', 'snap_transform.py'], '''
+        marker = vorla.create_node('marker')
+        print(vorla.attributes(marker))
+        print(vorla.get_attr(marker + '.nodeBoundingBoxMin'),
+              vorla.get_attr(marker + '.nodeBoundingBoxMax'))
+        vorla.set_attr(marker + '.localPosition', [1, 0, 2])
+        vorla.set_attr(marker + '.localScale', [2, 2, 2])
+        print(vorla.get_attr(marker + '.nodeBoundingBoxMin'),
+              vorla.get_attr(marker + '.nodeBoundingBoxMax'))
+        snap = vorla.create_node('snapTransform')
+        vorla.set_attr(snap + '.translate', [1.2, 0.3, -0.8])
+        vorla.set_attr(snap + '.scale', [3, 3, 3])
+        print(vorla.get_attr(snap + '.matrix'))
+        ''')
+    assert lines[:4] == [
+        "['localPosition', 'localScale', 'nodeBoundingBoxMin', 'nodeBoundingBoxMax']",
+        '[-0.75, 0.0, -0.25] [0.75, 2.0, 0.25]',
+        '[-0.5, 0.0, 1.5] [2.5, 4.0, 2.5]',
+        '[[3.0, 0.0, 0.0, 0.0], [0.0, 3.0, 0.0, 0.0], [0.0, 0.0, 3.0, 0.0], [1.0, 0.5, -1.0, 1.0]]']
+
+
+def test_scatter_command_with_flags_undo_and_misuse(vorla):
+    lines = run(vorla, ['sine_node.py', 'scatter_command.py'], '''
+        made = vorla.run_command('scatter', 'sineNode', '-count', 3, '-seed', 7,
+                                 '-attribute', 'input', '-range', 2, 4, '-p', 'dot')
+        print(made, all(2 <= vorla.get_attr(n + '.input') <= 4 for n in made))
+        vorla.undo()
+        print(vorla.nodes())
+        vorla.redo()
+        print([n for n, _, _ in vorla.nodes()])
+        for args in [('sineNode', '-count', -2), ('sineNode', '-range', 0), ('sineNode', '-x')]:
+            try:
+                vorla.run_command('scatter', *args)
+            except RuntimeError as e:
+                print(e)
+        vorla.undo()
+        ''')
+    assert lines[:6] == [
+        "['dot1', 'dot2', 'dot3'] True", '[]', "['dot1', 'dot2', 'dot3']",
+        "The flag '-count' of the command 'scatter' takes an integer of 0 or more, not -2",
+        "The flag '-range' of the command 'scatter' takes 2 arguments, not 1",
+        "The command 'scatter' has no flag '-x'"]
