@@ -97,14 +97,17 @@ def _pointer_class(p: PointerClass, home: str) -> str:
 
 
 def _imports(module: Module, types: list[PyType], extension: bool) -> str:
+    """The sibling modules the stub names: the classes' own module and those
+    its types mention; the proxy module also imports those it derives from."""
     used = set().union(*(t.modules for t in types)) if types else set()
-    if not extension:
+    used.discard('')
+    if extension:
+        used.add(module.proxy)
+    else:
+        used |= set(module.imports)
         used.discard(module.proxy)
-    names = sorted(m for m in used | set(module.imports if not extension else []) if m)
-    out = [f'from . import {m}\n' for m in names]
-    if '' in used:
-        out.append('from . import _SwigPyObject\n')
-    return ''.join(out)
+    # Every proxy object's `this` is a wrapped pointer.
+    return ''.join(f'from . import {m}\n' for m in sorted(used) + ['_SwigPyObject'])
 
 
 def _types(module: Module) -> list[PyType]:
@@ -174,7 +177,7 @@ def emit_extension(module: Module) -> str:
             typed[ep.entry] = (ep, c)
     out = [banner(module, f'type stubs of {module.name}', '#'),
            f'"""The flat built-ins of {module.proxy}, its constants and its variables."""\n',
-           _TYPING, '\n', f'from . import {module.proxy}\n', _imports(module, types, True),
+           _TYPING, '\n', _imports(module, types, True),
            _values(module, home), '\n']
     out += [_flat(e, typed, home, module.proxy) for e in module.entries]
     return ''.join(out)

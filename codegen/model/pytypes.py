@@ -96,7 +96,7 @@ class PySignature:
     def describe(self, home: str) -> str:
         """name(param: type, ...) -> result, as documentation shows it."""
         params = ', '.join(f'{p.name}: {p.type.render(home)}' +
-                           ('' if p.default is None else f'={p.default}') for p in self.params)
+                           ('' if p.default is None else f' = {p.default}') for p in self.params)
         return f'{self.name}({params}) -> {self.result.render(home)}'
 
     @property
