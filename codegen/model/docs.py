@@ -4,6 +4,8 @@ __doc__ (the headers' comments, then what the application calls on a
 subclass and what it expects back, then the constants)."""
 from __future__ import annotations
 
+import textwrap
+
 from .pytypes import SCALAR_TYPES, PyType, TypeScope, distinct_forms
 from .records import Forward, Module, WrappedClass
 
@@ -62,7 +64,7 @@ def member_doc(c: WrappedClass, ep, forwards: list[Forward], home: str) -> str:
         parts.append('\n'.join(['The application calls it on an instance of a subclass that '
                                 'overrides it, as'] +
                                _indented([f.python.describe(home) for f in forwards])) +
-                     '\n' + ' '.join(said))
+                     '\n' + textwrap.fill(' '.join(said), 79))
     return '\n\n'.join(parts)
 
 
