@@ -19,6 +19,8 @@ def _docstring(text: str, indent: str) -> str:
     text = text.replace('\\', '\\\\').replace('"""', '\\"\\"\\"')
     lines = text.split('\n')
     body = '\n'.join([lines[0]] + [indent + line if line else '' for line in lines[1:]])
+    if body.endswith('"'):   # it would run into the closing quotes
+        body = body[:-1] + '\\"'
     return f'{indent}"""{body}"""\n'
 
 
