@@ -4,7 +4,8 @@ PYTHON   := /usr/bin/python3
 BUILD    ?= build
 # The same tree built with AddressSanitizer and UndefinedBehaviorSanitizer.
 ASAN_BUILD ?= $(BUILD)-asan
-PACKAGES := cmake ninja-build g++ python3-dev python3-pytest python3-clang-14 python3-numpy
+PACKAGES := cmake ninja-build g++ python3-dev python3-pytest python3-clang-14 python3-numpy \
+            python3-mypy
 BENCH_PACKAGES := pybind11-dev
 
 .PHONY: all deps build build-asan test test-plain test-asan demo bench clean

@@ -5,6 +5,9 @@
 # runtime and to the host libraries it wraps.
 file(GLOB_RECURSE CODEGEN_SOURCES CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/codegen/*.py)
 file(GLOB_RECURSE HOST_HEADERS CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/host/include/*.h)
+# A module's Python types name the classes of the modules sharing its type
+# table, so every manifest is an input of every module.
+file(GLOB MANIFESTS CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/wrap/*.toml)
 
 function(openvorla_binding manifest)
   cmake_parse_arguments(B "" "" "LIBS;SOURCES" ${ARGN})
@@ -33,12 +36,13 @@ function(openvorla_binding manifest)
   add_custom_command(
     OUTPUT ${stamp}
     BYPRODUCTS ${outputs} ${PACKAGE_DIR}/${stem}.py ${PACKAGE_DIR}/${stem}.interface.json
+               ${PACKAGE_DIR}/${stem}.pyi ${PACKAGE_DIR}/_${stem}.pyi
     COMMAND ${Python3_EXECUTABLE} -m codegen generate ${manifest_path}
             --include ${CMAKE_SOURCE_DIR}/host/include
             --cxx-out ${gen_dir} --py-out ${PACKAGE_DIR}
     COMMAND ${CMAKE_COMMAND} -E touch ${stamp}
     WORKING_DIRECTORY ${CMAKE_SOURCE_DIR}
-    DEPENDS ${manifest_path} ${CODEGEN_SOURCES} ${HOST_HEADERS}
+    DEPENDS ${MANIFESTS} ${CODEGEN_SOURCES} ${HOST_HEADERS}
     COMMENT "Generating the ${stem} bindings")
   add_custom_target(${stem}_generated DEPENDS ${stamp})
 

@@ -14,8 +14,8 @@ import sys
 from . import manifest as manifest_mod
 from . import model as model_mod
 from . import parse as parse_mod
-from .emit import (directors, drive, entries, header, init, interface, proxy, table, types,
-                   variables)
+from .emit import (directors, drive, entries, header, init, interface, proxy, stubs, table,
+                   types, variables)
 from .model.drive import drive_calls
 
 
@@ -48,10 +48,21 @@ def load_module(manifest_path: str, include_dirs: list[str]) -> model_mod.Module
     return load_with_headers(manifest_path, include_dirs)[0]
 
 
+def sibling_manifests(manifest_path: str, m: manifest_mod.Manifest) -> list[manifest_mod.Manifest]:
+    """The manifests of the modules sharing the type table, beside this one;
+    a module whose manifest is elsewhere is known to this one by name only."""
+    out = []
+    for name in m.imports + m.siblings:
+        path = os.path.join(os.path.dirname(manifest_path), f'{name}.toml')
+        if os.path.exists(path):
+            out.append(manifest_mod.load(path))
+    return out
+
+
 def load_with_headers(manifest_path: str, include_dirs: list[str]):
     m = manifest_mod.load(manifest_path, os.path.relpath(manifest_path))
     headers = parse_mod.parse([c.header for c in m.classes], include_dirs, m.namespace)
-    return model_mod.build(m, headers), headers
+    return model_mod.build(m, headers, sibling_manifests(manifest_path, m)), headers
 
 
 def _write(path: str, text: str):
@@ -99,6 +110,8 @@ def main(argv: list[str]) -> int:
         _write(os.path.join(args.cxx_out, name), text)
     _write(os.path.join(args.py_out, f'{module.proxy}.py'), proxy.emit(module))
     _write(os.path.join(args.py_out, f'{module.proxy}.interface.json'), interface.emit(module))
+    _write(os.path.join(args.py_out, f'{module.proxy}.pyi'), stubs.emit_proxy(module))
+    _write(os.path.join(args.py_out, f'{module.name}.pyi'), stubs.emit_extension(module))
     return 0
 
 

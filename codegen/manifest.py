@@ -24,6 +24,9 @@ class Manifest:
     api_version_macro: str = ''
     string_constants: list[str] = field(default_factory=list)
     imports: list[str] = field(default_factory=list)       # sibling proxy modules
+    # Proxy modules that share the type table without being imported: the
+    # Python types of this one may name their classes.
+    siblings: list[str] = field(default_factory=list)
     types: dict[str, str] = field(default_factory=dict)    # mangled -> readable
     bases: dict[str, str] = field(default_factory=dict)    # known-by-name class -> base
     casts: dict[str, list[str]] = field(default_factory=dict)  # target -> sources
@@ -63,6 +66,7 @@ def load(path: str, display_name: str | None = None) -> Manifest:
             api_version_macro=mod.get('api_version_macro', ''),
             string_constants=list(mod.get('string_constants', [])),
             imports=list(mod.get('imports', [])),
+            siblings=list(mod.get('siblings', [])),
             types=dict(data.get('types', {})), bases=dict(data.get('bases', {})),
             casts={k: list(v) for k, v in data.get('casts', {}).items()},
             pointer_classes=[(p['name'], p['type']) for p in mod.get('pointer_classes', [])],

@@ -47,6 +47,7 @@ class Function:
     const: bool = False
     virtual: bool = False
     pure: bool = False
+    doc: str = ''                # the comment above the declaration
 
 
 @dataclass
@@ -62,6 +63,29 @@ class Variable:
     type: CType
     access: str
     static: bool
+    doc: str = ''
+    value: int | float | None = None   # a literal initializer's number
+
+
+def _literal(cursor) -> int | float | None:
+    """The number a declaration is initialised with, when it is a literal."""
+    spelled = [t.spelling for t in cursor.get_tokens()]
+    if '=' not in spelled:
+        return None
+    words = spelled[spelled.index('=') + 1:]
+    sign = -1 if words[:1] == ['-'] else 1
+    words = words[1:] if sign < 0 else words
+    if len(words) != 1:
+        return None
+    text = words[0].rstrip('uUlL')
+    try:
+        return sign * int(text, 0)
+    except ValueError:
+        pass
+    try:
+        return sign * float(text.rstrip('fF'))
+    except ValueError:
+        return None
 
 
 @dataclass
@@ -76,6 +100,8 @@ class Class:
     variables: list[Variable] = field(default_factory=list)
     abstract: bool = False
     polymorphic: bool = False
+    doc: str = ''               # the comment above the class, or the header's
+                                # opening comment when the header is named after it
 
 
 @dataclass
@@ -98,6 +124,38 @@ def _join(tokens: list[str]) -> str:
 def _deleted(cursor) -> bool:
     tokens = [t.spelling for t in cursor.get_tokens()]
     return tokens[-2:] == ['=', 'delete'] or tokens[-3:-1] == ['=', 'delete']
+
+
+def comment_text(raw: str | None) -> str:
+    """The text of a `//` or `/* */` comment, its markers and the one space
+    after them removed, its lines kept."""
+    if not raw:
+        return ''
+    lines = []
+    for line in raw.strip().splitlines():
+        line = line.strip()
+        line = re.sub(r'^(///?<?|/\*+|\*+/|\*)', '', line)
+        line = re.sub(r'\*+/$', '', line)
+        lines.append(line[1:] if line.startswith(' ') else line)
+    while lines and not lines[0].strip():
+        lines.pop(0)
+    while lines and not lines[-1].strip():
+        lines.pop()
+    return '\n'.join(line.rstrip() for line in lines)
+
+
+def _opening_comment(path: str) -> str:
+    """The comment a header opens with: its leading `//` lines."""
+    lines = []
+    try:
+        with open(path, encoding='utf-8', errors='replace') as f:
+            for line in f:
+                if not line.startswith('//'):
+                    break
+                lines.append(line)
+    except OSError:   # a header given as text, not a file
+        return ''
+    return comment_text(''.join(lines))
 
 
 def _access(cursor) -> str:
@@ -176,7 +234,8 @@ class _Reader:
             name=cursor.spelling, access=_access(cursor), params=self.params(cursor),
             result=self.ctype(cursor.result_type) if with_result else None,
             static=cursor.is_static_method(), const=cursor.is_const_method(),
-            virtual=cursor.is_virtual_method(), pure=cursor.is_pure_virtual_method())
+            virtual=cursor.is_virtual_method(), pure=cursor.is_pure_virtual_method(),
+            doc=comment_text(cursor.raw_comment))
 
     def header_of(self, cursor) -> str | None:
         loc = cursor.location.file
@@ -188,7 +247,10 @@ class _Reader:
         return os.path.relpath(path, self.include_dir)
 
     def read_class(self, cursor, header: str) -> Class:
-        cls = Class(self.qualified(cursor), header, abstract=cursor.is_abstract_record())
+        cls = Class(self.qualified(cursor), header, abstract=cursor.is_abstract_record(),
+                    doc=comment_text(cursor.raw_comment))
+        if not cls.doc and os.path.splitext(os.path.basename(header))[0] == cursor.spelling:
+            cls.doc = _opening_comment(os.path.join(self.include_dir, header))
         for c in cursor.get_children():
             if c.kind != K.CXX_BASE_SPECIFIER and _access(c) == 'private':
                 continue
@@ -207,9 +269,11 @@ class _Reader:
                                       [(e.spelling, e.enum_value) for e in c.get_children()
                                        if e.kind == K.ENUM_CONSTANT_DECL]))
             elif c.kind == K.VAR_DECL:
-                cls.variables.append(Variable(c.spelling, self.ctype(c.type), _access(c), True))
+                cls.variables.append(Variable(c.spelling, self.ctype(c.type), _access(c), True,
+                                              comment_text(c.raw_comment), _literal(c)))
             elif c.kind == K.FIELD_DECL:
-                cls.variables.append(Variable(c.spelling, self.ctype(c.type), _access(c), False))
+                cls.variables.append(Variable(c.spelling, self.ctype(c.type), _access(c), False,
+                                              comment_text(c.raw_comment)))
         cls.polymorphic = any(f.virtual for f in cls.methods) or bool(
             cls.destructor and cls.destructor.virtual)
         return cls
@@ -223,7 +287,9 @@ def parse(headers: list[str], include_dirs: list[str], namespace: str,
     source = ''.join(f'#include <{h}>\n' for h in headers)
     files = [('__codegen_all.cpp', source)]
     files += list((unsaved or {}).items())
-    args = ['-x', 'c++', '-std=c++17'] + [f'-I{d}' for d in include_dirs]
+    # Plain `//` comments are the headers' documentation: libclang attaches
+    # them to the declaration below them only when asked to.
+    args = ['-x', 'c++', '-std=c++17', '-fparse-all-comments'] + [f'-I{d}' for d in include_dirs]
     options = (ci.TranslationUnit.PARSE_SKIP_FUNCTION_BODIES
                | ci.TranslationUnit.PARSE_DETAILED_PROCESSING_RECORD)
     tu = ci.Index.create().parse('__codegen_all.cpp', args=args, unsaved_files=files,

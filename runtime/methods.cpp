@@ -44,13 +44,22 @@ PyObject *Call(PyObject *self, PyObject *const *args, size_t nargsf, PyObject *k
   return PyObject_Vectorcall(m->function, args, nargsf, kwnames);
 }
 
+// method(builtin, doc=None, signature=None): the documentation lives in the
+// proxy module, since the method table's entries carry none.
 PyObject *New(PyTypeObject *type, PyObject *args, PyObject *kwargs) {
   PyObject *function;
+  PyObject *doc = Py_None;
+  PyObject *signature = Py_None;
   if (kwargs && PyDict_GET_SIZE(kwargs)) {
     PyErr_SetString(PyExc_TypeError, "method() takes no keyword arguments");
     return nullptr;
   }
-  if (!PyArg_ParseTuple(args, "O!:method", &PyCFunction_Type, &function)) return nullptr;
+  if (!PyArg_ParseTuple(args, "O!|OO:method", &PyCFunction_Type, &function, &doc, &signature))
+    return nullptr;
+  if (signature != Py_None && !PyUnicode_Check(signature)) {
+    PyErr_SetString(PyExc_TypeError, "method() signature must be a str or None");
+    return nullptr;
+  }
   auto *m = reinterpret_cast<Method *>(type->tp_alloc(type, 0));
   if (!m) return nullptr;
   m->function = Py_NewRef(function);
@@ -59,8 +68,8 @@ PyObject *New(PyTypeObject *type, PyObject *args, PyObject *kwargs) {
   m->flags = PyCFunction_GET_FLAGS(function) & (METH_VARARGS | METH_O | METH_NOARGS | METH_KEYWORDS |
                                                 METH_FASTCALL);
   m->vectorcall = Call;
-  m->doc = Py_NewRef(Py_None);
-  m->signature = Py_NewRef(Py_None);
+  m->doc = Py_NewRef(doc);
+  m->signature = Py_NewRef(signature);
   return reinterpret_cast<PyObject *>(m);
 }
 
@@ -83,6 +92,10 @@ PyObject *Name(PyObject *self, void *) {
   return PyObject_GetAttrString(reinterpret_cast<Method *>(self)->function, "__name__");
 }
 
+// None: inspect.signature stops unwrapping here and reads __text_signature__
+// instead of going on to the built-in, which has none.
+PyObject *Signature(PyObject *, void *) { Py_RETURN_NONE; }
+
 PyObject *Repr(PyObject *self) {
   PyObject *name = Name(self, nullptr);
   if (!name) return nullptr;
@@ -100,6 +113,7 @@ PyMemberDef members[] = {
 
 PyGetSetDef getset[] = {
     {"__name__", Name, nullptr, "the name of the built-in function", nullptr},
+    {"__signature__", Signature, nullptr, nullptr, nullptr},
     {nullptr, nullptr, nullptr, nullptr, nullptr},
 };
 
@@ -121,7 +135,8 @@ extern "C" __attribute__((visibility("default"))) PyObject *PyInit__methods() {
   MethodType.tp_flags =
       Py_TPFLAGS_DEFAULT | Py_TPFLAGS_METHOD_DESCRIPTOR | Py_TPFLAGS_HAVE_VECTORCALL;
   MethodType.tp_vectorcall_offset = offsetof(Method, vectorcall);
-  MethodType.tp_doc = "method(builtin): the built-in as a method of a proxy class";
+  MethodType.tp_doc =
+      "method(builtin, doc=None, signature=None): the built-in as a method of a proxy class";
   MethodType.tp_members = members;
   MethodType.tp_getset = getset;
   MethodType.tp_descr_get = Get;

@@ -62,7 +62,10 @@ _COMMON = ('    thisown = property(_thisown_get, _thisown_set, doc="True when Py
 def _class(cls: WrappedClass) -> str:
     base = cls.python_base or 'object'
     n = cls.name
-    out = [f'\nclass {n}({base}):\n', _COMMON]
+    out = [f'\nclass {n}({base}):\n']
+    if cls.doc:
+        out.append(f'    {cls.doc!r}\n\n')
+    out.append(_COMMON)
     ctor = cls.constructor
     if ctor is None:
         out.append('    def __init__(self, *args, **kwargs):\n'
@@ -80,10 +83,14 @@ def _class(cls: WrappedClass) -> str:
     for m in cls.members:
         if m.accessor:
             if m.accessor == 'get':
-                out.append(f'    {m.field} = property(_ext.{m.entry}, _ext.{m.entry[:-4]}_set)\n')
+                doc = f', None, {m.doc!r}' if m.doc else ''
+                out.append(f'    {m.field} = property(_ext.{m.entry}, _ext.{m.entry[:-4]}_set{doc})\n')
             continue
         if m.static:
             out.append(f'    {m.member} = _ext.{m.entry}\n')
+        elif m.doc:
+            out.append(f'    {m.member} = _instance_method(_ext.{m.entry}, {m.doc!r}, '
+                       f'{m.text_signature!r})\n')
         else:
             out.append(f'    {m.member} = _instance_method(_ext.{m.entry})\n')
     if cls.director:

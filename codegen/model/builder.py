@@ -8,6 +8,8 @@ from ..manifest import Manifest
 from ..parse import Class, CType, Function, Headers, Param, Variable
 from . import conversions
 from .dispatch import dispatch_rules
+from .docs import document
+from .pytypes import TypeScope
 from .records import (METH_NOARGS, METH_O, METH_VARARGS, Candidate, Cast, Companion, Constant,
                       Descriptor, DirectorClass, EntryPoint, Forward, GlobalVariable, MethodEntry,
                       Module, PointerClass, Result, WrappedClass)
@@ -21,9 +23,10 @@ OVERLOAD_HEAD = ("Wrong number or type of arguments for overloaded function '{}'
 
 
 class Builder:
-    def __init__(self, manifest: Manifest, headers: Headers):
+    def __init__(self, manifest: Manifest, headers: Headers, siblings: list[Manifest]):
         self.m = manifest
         self.h = headers
+        self.siblings = siblings
         self.descriptors: dict[str, Descriptor] = {}
 
     # descriptors
@@ -88,6 +91,7 @@ class Builder:
         for j, p in enumerate(fn.params):
             arg = conversions.argument(first + j, slot, p, entry, self.descriptor_for,
                                        self.m.callable_announcement, cls)
+            arg.name = p.name or f'arg{j + 1}'
             if arg.slot is not None:
                 slot += 1
             args.append(arg)
@@ -173,6 +177,7 @@ class Builder:
             for c, fn in zip(ep.candidates, fns):
                 c.virtual, c.pure = director and fn.virtual, fn.pure
                 c.protected, c.owner = fn.access == 'protected', cls.name
+                c.doc = fn.doc
             out.append(ep)
         for v in cls.variables:
             if not v.static and v.access == 'public':
@@ -200,13 +205,14 @@ class Builder:
                 value = conversions.argument(2, 1, Param(v.name, v.type), entry,
                                              self.descriptor_for, '', cls.name)
                 value.disown = v.type.kind == 'pointer' and v.type.inner.name in directors
+                value.name = v.name
                 args.append(value)
                 result = Result('void')
             else:
                 result = conversions.field_result(v.type, entry, self.descriptor_for)
             count = len(args)
             cand = Candidate(f'wrap_{entry}', f'{cls.name}::{v.name}', count, count, args,
-                             result, v.name)
+                             result, v.name, doc=v.doc)
             out.append(EntryPoint(entry, f'wrap_{entry}', METH_O if count == 1 else METH_VARARGS,
                                   [cand], member=f'{v.name}_{what}', field=v.name,
                                   accessor=what))
@@ -239,7 +245,8 @@ class Builder:
                 a.type = p.type
             result = conversions.forward_result(fn.result, where, self.descriptor_for)
             forwards.append(Forward(fn.name, owner, args, result, fn.const,
-                                    fn.access == 'protected', fn.pure, len(counts[fn.name]) > 1))
+                                    fn.access == 'protected', fn.pure, len(counts[fn.name]) > 1,
+                                    fn.doc))
         companions = []
         chain = [cls.name] + [b for b, declared in self.ancestors(cls.name) if declared]
         seen = set()
@@ -276,20 +283,22 @@ class Builder:
         for v in cls.variables:
             if not v.static or v.access != 'public':
                 continue
-            # A constant of a scalar type is a number of the class, as its
-            # enumerators are, rather than a variable to read through cvar.
+            # A constant of a scalar type that the header gives a number is a
+            # number of the class, as its enumerators are, rather than a
+            # variable to read through cvar.
             number = conversions.constant_number(v.type)
-            if number:
-                constants.append(Constant(f'{cls.name}_{v.name}', 0, f'{cls.name}::{v.name}',
-                                          number))
+            if number and v.value is not None:
+                constants.append(Constant(f'{cls.name}_{v.name}', v.value,
+                                          f'{cls.name}::{v.name}', number))
                 continue
             variables.append(GlobalVariable(f'{cls.name}_{v.name}', f'{cls.name}::{v.name}',
                                             spell(unqualified(v.type)), self.descriptor_for(v.type),
-                                            v.type.const))
+                                            v.type.const, v.doc))
         ctor = self.constructor(cls, entry.director)
         wrapped = WrappedClass(cls.name, entry.family, entry.header, entry.director, desc, base,
                                python_base, cls.polymorphic, ctor,
-                               self.members(cls, entry.director), constants, variables)
+                               self.members(cls, entry.director), constants, variables,
+                               comment=cls.doc)
         if entry.director:
             wrapped.director_class = self.director_class(cls, ctor)
         return wrapped
@@ -381,10 +390,25 @@ class Builder:
             for c in classes[1:]:
                 installs += c.constants + c.variables
         api = self.h.macros.get(self.m.api_version_macro, '') if self.m.api_version_macro else ''
-        return Module(self.m.name, self.m.proxy, self.m.source, self.m.namespace,
-                      [c.header for c in self.m.classes], self.m.imports, pointer_classes, classes,
-                      descriptors, entries, start, installs, api, functions,
-                      [(self.m.resource_table, key) for key in self.m.resources])
+        module = Module(self.m.name, self.m.proxy, self.m.source, self.m.namespace,
+                        [c.header for c in self.m.classes], self.m.imports, pointer_classes,
+                        classes, descriptors, entries, start, installs, api, functions,
+                        [(self.m.resource_table, key) for key in self.m.resources])
+        document(module, self.type_scope())
+        return module
+
+    def type_scope(self) -> TypeScope:
+        """The classes the module's Python types can name: its own and those
+        of the modules sharing its type table, and the enumerators whose
+        values stand for default arguments."""
+        scope = TypeScope(self.m.proxy)
+        for m in self.siblings + [self.m]:
+            scope.add_module(m.proxy, [c.name for c in m.classes], m.pointer_classes)
+        for cls in self.h.classes.values():
+            for e in cls.enums:
+                for n, v in e.enumerators:
+                    scope.enumerators[f'{cls.name}::{n}'] = v
+        return scope
 
     def string_macro(self, name: str) -> str:
         text = self.h.macros.get(name)
@@ -407,5 +431,7 @@ def _is_copy(f: Function, cls: str) -> bool:
     return t.kind in ('lvref', 'rvref') and t.inner.kind == 'record' and t.inner.name == cls
 
 
-def build(manifest: Manifest, headers: Headers) -> Module:
-    return Builder(manifest, headers).build()
+def build(manifest: Manifest, headers: Headers, siblings: list[Manifest] | None = None) -> Module:
+    """The model of a module; `siblings` are the manifests of the modules
+    that share its type table, whose classes its Python types may name."""
+    return Builder(manifest, headers, siblings or []).build()

@@ -2,9 +2,12 @@
 builder, read by the emitters."""
 from __future__ import annotations
 
+import dataclasses
 import hashlib
 import struct
 from dataclasses import dataclass, field
+
+from .pytypes import PySignature, PyType
 
 METH_VARARGS = 1
 METH_NOARGS = 4
@@ -58,6 +61,7 @@ class Arg:
     disown: bool = False         # object: the wrapper gives its object up to the host
     array: bool = False          # object: an array, passed as the pointer to its first
                                  # element, null refused like a reference
+    name: str = ''               # the parameter's name in the header
 
     @property
     def optional(self) -> bool:
@@ -92,6 +96,8 @@ class Candidate:
     pure: bool = False
     protected: bool = False
     owner: str = ''              # the class that declares the member
+    doc: str = ''                # the header's comment on the declaration
+    python: 'PySignature | None' = None   # as Python calls it
 
 
 @dataclass
@@ -119,6 +125,10 @@ class EntryPoint:
                                   # not an error but NotImplemented
     field: str = ''               # data member accessors: the member's name
     accessor: str = ''            # 'get' or 'set' for a data member accessor
+    doc: str = ''                 # __doc__ of the proxy's member
+    # The forms Python tells apart (`field` above is a member's name here).
+    forms: list['PySignature'] = dataclasses.field(default_factory=list)
+    text_signature: str | None = None   # its __text_signature__, when it has one form
 
     @property
     def converts_objects(self) -> bool:
@@ -131,7 +141,7 @@ class EntryPoint:
 @dataclass
 class Constant:
     name: str
-    value: int | str
+    value: int | float | str
     cpp: str = ''                 # the enumerator or macro, "VPxNode::kDependNode"
     make: str = ''                # the call making a number's Python value, when not a long
 
@@ -143,6 +153,8 @@ class GlobalVariable:
     spelling: str                 # the value type, "VObject"
     descriptor: Descriptor
     readonly: bool
+    doc: str = ''
+    python: 'PyType | None' = None
 
     @property
     def message(self) -> str:
@@ -164,6 +176,8 @@ class PointerClass:
     element_descriptor: Descriptor  # _p_int
     converter: str                # the convert/ routine for assign
     result: str                   # how value() converts
+    # assign, value, cast and frompointer as Python calls them; frompointer static
+    python: list[tuple['PySignature', bool]] = field(default_factory=list)
 
     def entry(self, what: str) -> str:
         return {'new': f'new_{self.name}', 'delete': f'delete_{self.name}'}.get(
@@ -185,6 +199,8 @@ class WrappedClass:
     constants: list[Constant]
     variables: list[GlobalVariable]
     director_class: 'DirectorClass | None' = None
+    comment: str = ''             # the header's comment on the class
+    doc: str = ''                 # __doc__ of the proxy class
 
     @property
     def delete_entry(self) -> str:
@@ -284,6 +300,7 @@ class ForwardArg:
     pointer: bool = False         # borrowed/director: the parameter is a pointer
     value_type: str = ''          # copied: the class copied
     type: object = None           # the declared CType, for tools that call overrides
+    python: 'PyType | None' = None   # what the Python method receives
 
 
 @dataclass
@@ -299,6 +316,7 @@ class ForwardResult:
     descriptor: Descriptor | None = None
     message: str = ''
     null_message: str = ''
+    python: 'PyType | None' = None   # what the Python method is to return
 
 
 @dataclass
@@ -312,6 +330,9 @@ class Forward:
     protected: bool
     pure: bool
     arity: bool                   # tested against the Python method's signature
+    doc: str = ''                 # the header's comment on the declaration
+    python: 'PySignature | None' = None   # as the application calls the Python method
+    returns: str = ''             # what the Python method is to return, in words
 
     @property
     def qualified(self) -> str:

@@ -15,7 +15,7 @@ from openvorla import OpenVorla as ov, OpenVorlaVPx as vpx
 
 
 class Marker(vpx.VPxLocatorNode):
-    name, type_id = 'marker', ov.VTypeId(0x7A211)
+    type_name, type_id = 'marker', ov.VTypeId(0x7A211)
 
     def isBounded(self):
         return True
@@ -30,7 +30,7 @@ class Marker(vpx.VPxLocatorNode):
 
 def initializePlugin(obj):
     vpx.VFnPlugin(obj, 'Vorla Examples', '1.0').registerNode(
-        Marker.name, Marker.type_id, Marker, lambda: None, vpx.VPxNode.kLocatorNode)
+        Marker.type_name, Marker.type_id, Marker, lambda: None, vpx.VPxNode.kLocatorNode)
 
 
 def uninitializePlugin(obj):

@@ -68,8 +68,8 @@ class Scatter(vpx.VPxCommand):
             self.undoIt()  # nothing half made stays behind
             raise
         vpx.VPxCommand.clearResult()
-        for name in self.made:
-            vpx.VPxCommand.appendToResult(name)
+        for made in self.made:
+            vpx.VPxCommand.appendToResult(made)
 
     def undoIt(self):
         for name in reversed(self.made):

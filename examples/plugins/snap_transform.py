@@ -24,7 +24,7 @@ class SnapMatrix(vpx.VPxTransformationMatrix):
 
 
 class SnapTransform(vpx.VPxTransform):
-    name, type_id = 'snapTransform', ov.VTypeId(0x7A212)
+    type_name, type_id = 'snapTransform', ov.VTypeId(0x7A212)
 
     def createTransformationMatrix(self):
         return SnapMatrix()
@@ -32,7 +32,7 @@ class SnapTransform(vpx.VPxTransform):
 
 def initializePlugin(obj):
     vpx.VFnPlugin(obj, 'Vorla Examples', '1.0').registerTransform(
-        SnapTransform.name, SnapTransform.type_id, SnapTransform, lambda: None, SnapMatrix,
+        SnapTransform.type_name, SnapTransform.type_id, SnapTransform, lambda: None, SnapMatrix,
         SnapMatrix.type_id)
 
 

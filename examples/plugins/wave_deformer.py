@@ -18,8 +18,10 @@ from openvorla import OpenVorla as ov, OpenVorlaVPx as vpx
 
 
 class WaveDeformer(vpx.VPxDeformerNode):
-    name, type_id = 'waveDeformer', ov.VTypeId(0x7A210)
-    amplitude = wavelength = None  # attributes, made by initialize()
+    type_name, type_id = 'waveDeformer', ov.VTypeId(0x7A210)
+    # Its attributes, made by initialize().
+    amplitude = ov.VObject()
+    wavelength = ov.VObject()
 
     def deform(self, block, iterator, matrix, index):
         envelope = block.inputValue(vpx.VPxGeometryFilter.envelope).asDouble()
@@ -52,7 +54,7 @@ def initialize():
 
 def initializePlugin(obj):
     vpx.VFnPlugin(obj, 'Vorla Examples', '1.0').registerNode(
-        WaveDeformer.name, WaveDeformer.type_id, WaveDeformer, initialize,
+        WaveDeformer.type_name, WaveDeformer.type_id, WaveDeformer, initialize,
         vpx.VPxNode.kDeformerNode)
 
 

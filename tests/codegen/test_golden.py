@@ -9,7 +9,7 @@ import os
 import pytest
 
 from codegen.__main__ import load_module, render
-from codegen.emit import proxy
+from codegen.emit import proxy, stubs
 
 HERE = os.path.dirname(__file__)
 GOLDEN = os.path.join(HERE, 'golden')
@@ -25,6 +25,8 @@ def outputs():
         os.chdir(cwd)
     files = render(module)
     files['Fixture.py'] = proxy.emit(module)
+    files['Fixture.pyi'] = stubs.emit_proxy(module)
+    files['_Fixture.pyi'] = stubs.emit_extension(module)
     return files
 
 

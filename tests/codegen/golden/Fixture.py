@@ -53,6 +53,8 @@ cvar = _ext.cvar
 SDK_MAKER = _ext.SDK_MAKER
 
 class Node(object):
+    'A node of the fixture graph.\n\nConstants:\n    kPlain = 0\n    kGroup = 3\n    kDefault = 3\n    kNone = 1\n\nStatic attributes:\n    caching: Value\n    identity: Value'
+
     thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")
     __repr__ = _proxy_repr
 
@@ -62,14 +64,14 @@ class Node(object):
 
     __swig_destroy__ = _ext.delete_Node
 
-    count = _instance_method(_ext.Node_count)
-    setCount = _instance_method(_ext.Node_setCount)
+    count = _instance_method(_ext.Node_count, 'count() -> int\n\nHow many there are.', '($self, /)')
+    setCount = _instance_method(_ext.Node_setCount, 'setCount(n: int, notify: bool = True) -> None', '($self, n, notify=True, /)')
     make = _ext.Node_make
-    parent = _instance_method(_ext.Node_parent)
-    value = _instance_method(_ext.Node_value)
-    rename = _instance_method(_ext.Node_rename)
-    names = _instance_method(_ext.Node_names)
-    pick = _instance_method(_ext.Node_pick)
+    parent = _instance_method(_ext.Node_parent, 'parent() -> Node | None', '($self, /)')
+    value = _instance_method(_ext.Node_value, 'value() -> Value', '($self, /)')
+    rename = _instance_method(_ext.Node_rename, "rename(name: str, aliases: list[str]) -> Literal['unknown'] | None", '($self, name, aliases, /)')
+    names = _instance_method(_ext.Node_names, 'names(prefix: str | None = None) -> list[str]', '($self, prefix=None, /)')
+    pick = _instance_method(_ext.Node_pick, 'pick(index: int) -> bool\npick(v: Value, index: int) -> bool\n\nPicks by index, or by value\nthen index.', None)
 
     def __disown__(self):
         self.this.disown()
@@ -124,6 +126,8 @@ class Mesh(Shape):
 _ext.Mesh_swigregister(Mesh)
 
 class Abstract(object):
+    'Operations the application calls on a subclass:\n    name() -> Value'
+
     thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")
     __repr__ = _proxy_repr
 
@@ -133,7 +137,7 @@ class Abstract(object):
 
     __swig_destroy__ = _ext.delete_Abstract
 
-    name = _instance_method(_ext.Abstract_name)
+    name = _instance_method(_ext.Abstract_name, 'name() -> Value\n\nThe name the host shows.\n\nThe application calls it on an instance of a subclass that overrides it, as\n    name() -> Value\nReturn a Value; the application keeps a copy.', '($self, /)')
 
     def __disown__(self):
         self.this.disown()
@@ -180,6 +184,8 @@ class Pair(object):
 _ext.Pair_swigregister(Pair)
 
 class Value(object):
+    'Static attributes:\n    kEmpty: Value'
+
     thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")
     __repr__ = _proxy_repr
 
@@ -194,6 +200,8 @@ class Value(object):
 _ext.Value_swigregister(Value)
 
 class Pod(object):
+    'A plain record: its data members are read and written in place.'
+
     thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")
     __repr__ = _proxy_repr
 
