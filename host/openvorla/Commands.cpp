@@ -28,7 +28,6 @@ namespace standin {
 using namespace OPENVORLA_NAMESPACE;
 using host::failed;
 using host::failure;
-using host::guarded;
 using host::guardedVoid;
 using host::quoted;
 
@@ -102,14 +101,22 @@ Commands &Commands::instance() {
 
 VStatus Commands::run(const std::string &name, const std::vector<Value> &args,
                       std::string *result) {
+  // Found again only when something is reported.
+  auto running = [&name](const char *doing) {
+    return [&name, doing] {
+      return Operation::Description{
+          host::pluginOf({"Command", "ConstraintCommand", "ContextCommand"}, name),
+          doing + quoted(name)};
+    };
+  };
   VPxCommand *command = nullptr;
-  VStatus status = guardedVoid([&] { command = standin::createCommand(name.c_str()); });
+  VStatus status = host::inPluginVoid(nullptr, nullptr, running("creating the command "),
+                                      [&] { command = standin::createCommand(name.c_str()); });
   if (!command) {
-    if (!status) return status;
     if (!host::isRegistered({"Command", "ConstraintCommand", "ContextCommand"}, name))
       return failure(VStatus::kNotFound, "No command named " + quoted(name) + " is registered");
-    return failure(VStatus::kFailure,
-                   "The creator of the command " + quoted(name) + " made no command");
+    return host::madeNone("The creator of the command " + quoted(name) + " made no command",
+                          status);
   }
   VArgList list;
   std::string line = name;
@@ -127,9 +134,12 @@ VStatus Commands::run(const std::string &name, const std::vector<Value> &args,
   }
   command->setCommandString(line.c_str());
   VPxCommand::clearResult();
-  status = guarded([&] { return command->doIt(list); });
+  status = host::inPlugin(command, "doIt", running("running the command "),
+                          [&] { return command->doIt(list); });
   bool undoable = false;
-  if (status) status = guardedVoid([&] { undoable = command->isUndoable(); });
+  if (status)
+    status = host::inPluginVoid(command, "isUndoable", running("running the command "),
+                                [&] { undoable = command->isUndoable(); });
   if (!status) {
     deleteCommands({{name, command}});
     return failed("The command " + quoted(name), status);
@@ -153,7 +163,7 @@ namespace {
 // succeeds, back on `from` when it fails.
 template <typename Call>
 VStatus step(std::mutex &mutex, std::vector<Kept> &from, std::vector<Kept> &to, const char *nothing,
-             const char *doing, Call call) {
+             const char *doing, const char *method, Call call) {
   Kept kept;
   {
     std::lock_guard<std::mutex> guard(mutex);
@@ -161,7 +171,14 @@ VStatus step(std::mutex &mutex, std::vector<Kept> &from, std::vector<Kept> &to, 
     kept = from.back();
     from.pop_back();
   }
-  VStatus status = guarded([&] { return call(kept.command); });
+  VStatus status = host::inPlugin(
+      kept.command, method,
+      [&] {
+        return Operation::Description{
+            host::pluginOf({"Command", "ConstraintCommand", "ContextCommand"}, kept.name),
+            host::lowered(doing) + " the command " + quoted(kept.name)};
+      },
+      [&] { return call(kept.command); });
   std::lock_guard<std::mutex> guard(mutex);
   if (!status) {
     from.push_back(kept);
@@ -174,12 +191,12 @@ VStatus step(std::mutex &mutex, std::vector<Kept> &from, std::vector<Kept> &to, 
 }  // namespace
 
 VStatus Commands::undo() {
-  return step(impl_->mutex, impl_->undo, impl_->redo, "There is nothing to undo", "Undoing",
+  return step(impl_->mutex, impl_->undo, impl_->redo, "There is nothing to undo", "Undoing", "undoIt",
               [](VPxCommand *c) { return c->undoIt(); });
 }
 
 VStatus Commands::redo() {
-  return step(impl_->mutex, impl_->redo, impl_->undo, "There is nothing to redo", "Redoing",
+  return step(impl_->mutex, impl_->redo, impl_->undo, "There is nothing to redo", "Redoing", "redoIt",
               [](VPxCommand *c) { return c->redoIt(); });
 }
 

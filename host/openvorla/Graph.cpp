@@ -153,9 +153,11 @@ std::shared_ptr<const NodeType> GraphState::nodeType(const std::string &typeName
     type->attributes[to].computed = true;
   }
   for (const RegistrationInfo &r : standin::registrations())
-    if (r.name == typeName && (r.kind == "Node" || r.kind == "Shape" || r.kind == "Transform"))
+    if (r.name == typeName && (r.kind == "Node" || r.kind == "Shape" || r.kind == "Transform")) {
+      type->plugin = r.plugin;
       for (const RegisteredCallback &c : r.callbacks)
         if (c.role == "creator" && c.script) type->scripted = true;
+    }
   type->affectedBy.assign(type->attributes.size(), {});
   for (size_t from = 0; from < type->attributes.size(); ++from)
     for (int to : type->attributes[from].affects)
@@ -218,11 +220,14 @@ VStatus Graph::createNode(const std::string &type, const std::string &name, std:
   std::shared_ptr<const graph::NodeType> nodeType = impl_->nodeType(type, &status);
   if (!nodeType) return status;
   VPxNode *raw = nullptr;
-  status = host::guardedVoid([&] { raw = standin::createNode(type.c_str()); });
-  if (!raw)
-    return status ? failure(VStatus::kFailure,
-                            "The creator of the node type " + quoted(type) + " made no node")
-                  : status;
+  status = host::inPluginVoid(
+      nullptr, nullptr,
+      [&] {
+        return Operation::Description{nodeType->plugin,
+                                      "creating a node of the type " + quoted(type)};
+      },
+      [&] { raw = standin::createNode(type.c_str()); });
+  if (!raw) return host::madeNone("The creator of the node type " + quoted(type) + " made no node", status);
 
   graph::NodePtr node;
   {
@@ -246,7 +251,13 @@ VStatus Graph::createNode(const std::string &type, const std::string &name, std:
     standin::deleteNode(raw);
     return failure(VStatus::kFailure, "A node named " + quoted(name) + " already exists");
   }
-  host::guardedVoid([&] { raw->postConstructor(); });
+  // The node is made whatever its postConstructor does; a failure is in the log.
+  host::inPluginVoid(
+      raw, "postConstructor",
+      [&] {
+        return Operation::Description{nodeType->plugin, "creating the node " + quoted(node->name)};
+      },
+      [&] { raw->postConstructor(); });
   if (made) *made = node->name;
   return VStatus::kSuccess;
 }

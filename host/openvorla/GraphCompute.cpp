@@ -119,7 +119,13 @@ VStatus GraphState::compute(const NodePtr &node, int attribute) {
   tFrame = &frame;
   ++node->computeCount;
   if (tEvaluation.run) tEvaluation.run->noteCompute();
-  VStatus status = guarded([&] { return node->node->compute(plug, node->block); });
+  VStatus status = host::inPlugin(
+      node->node, "compute",
+      [&] {
+        return Operation::Description{node->type->plugin,
+                                      "computing " + quoted(node->plugName(attribute))};
+      },
+      [&] { return node->node->compute(plug, node->block); });
   tFrame = frame.outer;
   {
     std::lock_guard<std::mutex> guard(mutex);
