@@ -3,10 +3,10 @@
 // object, which the plug-in hands to VFnPlugin to register what it provides.
 #include "Application.h"
 
+#include <basekit/Tlog.h>
 #include <openvorla/VFnPlugin.h>
 #include <openvorla/VObject.h>
 #include <scriptrunner/TpythonInterpreter.h>
-#include <basekit/Tlog.h>
 #include <standin/Graph.h>
 #include <standin/Operation.h>
 #include <standin/Plugins.h>

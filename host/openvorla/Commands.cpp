@@ -191,13 +191,13 @@ VStatus step(std::mutex &mutex, std::vector<Kept> &from, std::vector<Kept> &to, 
 }  // namespace
 
 VStatus Commands::undo() {
-  return step(impl_->mutex, impl_->undo, impl_->redo, "There is nothing to undo", "Undoing", "undoIt",
-              [](VPxCommand *c) { return c->undoIt(); });
+  return step(impl_->mutex, impl_->undo, impl_->redo, "There is nothing to undo", "Undoing",
+              "undoIt", [](VPxCommand *c) { return c->undoIt(); });
 }
 
 VStatus Commands::redo() {
-  return step(impl_->mutex, impl_->redo, impl_->undo, "There is nothing to redo", "Redoing", "redoIt",
-              [](VPxCommand *c) { return c->redoIt(); });
+  return step(impl_->mutex, impl_->redo, impl_->undo, "There is nothing to redo", "Redoing",
+              "redoIt", [](VPxCommand *c) { return c->redoIt(); });
 }
 
 void Commands::flush() {

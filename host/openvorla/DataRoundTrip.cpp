@@ -70,8 +70,7 @@ class Instance {
     if (fData) return status;
     if (!host::isRegistered({"Data"}, type))
       return failure(VStatus::kNotFound, "No data type named " + quoted(type) + " is registered");
-    return host::madeNone("The creator of the data type " + quoted(type) + " made no data",
-                          status);
+    return host::madeNone("The creator of the data type " + quoted(type) + " made no data", status);
   }
   VPxData &operator*() { return *fData; }
   VPxData *operator->() { return fData; }
@@ -95,8 +94,8 @@ VStatus roundTripData(const std::string &dataType, const std::string &text, std:
   if (!status) return failed("Reading" + what + " from ASCII", status);
   status = copy.make(dataType);
   if (!status) return status;
-  status = host::inPluginVoid(&*copy, "copy", Step{dataType, "copying", ""},
-                              [&] { copy->copy(*read); });
+  status =
+      host::inPluginVoid(&*copy, "copy", Step{dataType, "copying", ""}, [&] { copy->copy(*read); });
   if (!status) return failed("Copying" + what, status);
   for (auto [data, out] : {std::make_pair(&read, written), std::make_pair(&copy, copied)}) {
     std::ostringstream stream;

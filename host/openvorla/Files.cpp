@@ -27,9 +27,8 @@ VStatus transfer(const std::string &path, const std::string &name, bool write) {
     return Operation::Description{host::pluginOf({"FileTranslator"}, name), doing};
   };
   VPxFileTranslator *translator = nullptr;
-  VStatus status = host::inPluginVoid(nullptr, nullptr, describe, [&] {
-    translator = standin::createTranslator(name.c_str());
-  });
+  VStatus status = host::inPluginVoid(
+      nullptr, nullptr, describe, [&] { translator = standin::createTranslator(name.c_str()); });
   if (!translator) {
     if (!host::isRegistered({"FileTranslator"}, name))
       return failure(VStatus::kNotFound,
@@ -39,11 +38,9 @@ VStatus transfer(const std::string &path, const std::string &name, bool write) {
   }
   const std::string what = "The file translator " + quoted(name);
   bool able = false;
-  status = host::inPluginVoid(translator, write ? "haveWriteMethod" : "haveReadMethod", describe,
-                              [&] {
-                                able = write ? translator->haveWriteMethod()
-                                             : translator->haveReadMethod();
-                              });
+  status = host::inPluginVoid(
+      translator, write ? "haveWriteMethod" : "haveReadMethod", describe,
+      [&] { able = write ? translator->haveWriteMethod() : translator->haveReadMethod(); });
   if (status && !able)
     status = failure(VStatus::kNotImplemented,
                      what + (write ? " does not write files" : " does not read files"));

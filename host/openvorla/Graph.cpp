@@ -227,7 +227,8 @@ VStatus Graph::createNode(const std::string &type, const std::string &name, std:
                                       "creating a node of the type " + quoted(type)};
       },
       [&] { raw = standin::createNode(type.c_str()); });
-  if (!raw) return host::madeNone("The creator of the node type " + quoted(type) + " made no node", status);
+  if (!raw)
+    return host::madeNone("The creator of the node type " + quoted(type) + " made no node", status);
 
   graph::NodePtr node;
   {

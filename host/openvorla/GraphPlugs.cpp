@@ -92,7 +92,10 @@ template <typename Call>
 void tell(const graph::Node &node, const char *method, const std::string &doing, Call call) {
   host::inPlugin(
       node.node, method,
-      [&] { return Operation::Description{node.type->plugin, doing}; }, call);
+      [&] {
+        return Operation::Description{node.type->plugin, doing};
+      },
+      call);
 }
 
 }  // namespace
@@ -179,8 +182,10 @@ VStatus Graph::connect(const std::string &source, const std::string &destination
   VPlug toPlug(to->node->thisVObject(), to->type->attributes[toAttribute].object);
   // What the nodes answer is theirs to know; the connection stands.
   const std::string doing = "connecting " + quoted(source) + " to " + quoted(destination);
-  tell(*from, "connectionMade", doing, [&] { return from->node->connectionMade(fromPlug, toPlug, true); });
-  tell(*to, "connectionMade", doing, [&] { return to->node->connectionMade(toPlug, fromPlug, false); });
+  tell(*from, "connectionMade", doing,
+       [&] { return from->node->connectionMade(fromPlug, toPlug, true); });
+  tell(*to, "connectionMade", doing,
+       [&] { return to->node->connectionMade(toPlug, fromPlug, false); });
   return VStatus::kSuccess;
 }
 
@@ -205,8 +210,10 @@ VStatus Graph::disconnect(const std::string &source, const std::string &destinat
   VPlug fromPlug(from->node->thisVObject(), from->type->attributes[fromAttribute].object);
   VPlug toPlug(to->node->thisVObject(), to->type->attributes[toAttribute].object);
   const std::string doing = "disconnecting " + quoted(source) + " from " + quoted(destination);
-  tell(*from, "connectionBroken", doing, [&] { return from->node->connectionBroken(fromPlug, toPlug, true); });
-  tell(*to, "connectionBroken", doing, [&] { return to->node->connectionBroken(toPlug, fromPlug, false); });
+  tell(*from, "connectionBroken", doing,
+       [&] { return from->node->connectionBroken(fromPlug, toPlug, true); });
+  tell(*to, "connectionBroken", doing,
+       [&] { return to->node->connectionBroken(toPlug, fromPlug, false); });
   return VStatus::kSuccess;
 }
 
