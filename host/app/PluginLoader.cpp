@@ -79,11 +79,12 @@ bool runStep(const VObject &object, const char *doing, std::string *why, Step st
 }
 
 // The checker's findings on the loaded plug-in, each "file:line: message",
-// its own file shown as `file`. A checker that fails is reported, and has
-// found nothing.
+// its own file shown as `file`. A checker that fails is reported, and its
+// failure is the one finding.
 std::vector<std::string> check(PyObject *module, const VObject &object, const std::string &file) {
   std::vector<std::string> findings;
-  runStep(object, "checking the plug-in", nullptr, [&] {
+  std::string why;
+  bool checked = runStep(object, "checking the plug-in", &why, [&] {
     PyObject *checker = PyImport_ImportModule("openvorla.check");
     PyObject *lines = checker ? PyObject_CallMethod(checker, "check_plugin", "Oss", module,
                                                     nameOf(object).c_str(), file.c_str())
@@ -99,6 +100,8 @@ std::vector<std::string> check(PyObject *module, const VObject &object, const st
     Py_XDECREF(fast);
     return !PyErr_Occurred();
   });
+  // Not finding anything is no pass when the checks could not look.
+  if (!checked) findings.assign(1, file + ":1: the checks failed" + why);
   return findings;
 }
 
