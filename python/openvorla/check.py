@@ -227,9 +227,23 @@ def returns(function):
         tree = ast.parse(textwrap.dedent(''.join(lines)))
     except (OSError, TypeError, SyntaxError):
         return []
+    if function.__name__ == '<lambda>':
+        # Its source is the statement it is in: the lambda whose body is
+        # where the code's instructions are.
+        indent = len(lines[0]) - len(lines[0].lstrip())
+        body = {(line - first + 1, column - indent)
+                for line, _, column, _ in function.__code__.co_positions()
+                if line is not None and column is not None}
+        lambdas = [n for n in ast.walk(tree) if isinstance(n, ast.Lambda)
+                   and (n.body.lineno, n.body.col_offset) in body]
+        if len(lambdas) != 1:
+            return []
+        line = lambdas[0].body.lineno
+        tree = ast.Module([ast.FunctionDef(
+            '<lambda>', lambdas[0].args, [ast.Return(lambdas[0].body, lineno=line)], [])], [])
     body = tree.body[0] if tree.body else None
     if not isinstance(body, (ast.FunctionDef, ast.AsyncFunctionDef)):
-        return []  # a lambda, or a def that the source does not start with
+        return []  # a def that the source does not start with
     found, returned = [], False
     for node in walk_body(body):
         if not isinstance(node, ast.Return):

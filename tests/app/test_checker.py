@@ -37,6 +37,8 @@ def test_each_fault_is_reported_at_its_line(vorla):
         'subclass of VPxCommand',
         f"{k}:24: silent_maker, the creator of registerCommand('silent'), returns None, not a "
         'subclass of VPxCommand',
+        f"{k}:39: initializePlugin.<locals>.<lambda>, the creator of "
+        "registerNode('command_as_node'), returns a Command, not a subclass of VPxNode",
         f'{n}:6: Typo.compte matches no operation of VPxNode: did you mean compute?',
         f'{n}:20: Loose.readAscii matches no operation of VPxData: did you mean readASCII?',
         f'{n}:23: Loose.writeascii matches no operation of VPxData: did you mean writeASCII?',
