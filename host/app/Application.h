@@ -18,8 +18,14 @@ namespace vorla {
 
 // Imports the file as a module named after it, makes the plug-in's object and
 // runs the module's initializePlugin with it. `name` receives the plug-in's
-// name (the file's stem, made unique among loaded plug-ins).
-std::string loadPlugin(const std::string &file, std::string *name);
+// name (the file's stem, made unique among loaded plug-ins). The loaded
+// plug-in is checked (openvorla.check): its findings, each "file:line:
+// message", go to `findings`, or without it to the log as warnings. The
+// failure text ends with the Python exception that caused it, if one did.
+std::string loadPlugin(const std::string &file, std::string *name,
+                       std::vector<std::string> *findings = nullptr);
+// A finding as a warning of the log: "file:line: warning: message".
+std::string warning(const std::string &finding);
 // Deletes the nodes of the plug-in's types and the commands kept for undo,
 // runs uninitializePlugin, and forgets everything the plug-in registered.
 std::string unloadPlugin(const std::string &name);

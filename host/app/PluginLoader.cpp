@@ -3,10 +3,12 @@
 // object, which the plug-in hands to VFnPlugin to register what it provides.
 #include "Application.h"
 
+#include <basekit/Tlog.h>
 #include <openvorla/VFnPlugin.h>
 #include <openvorla/VObject.h>
 #include <scriptrunner/TpythonInterpreter.h>
 #include <standin/Graph.h>
+#include <standin/Operation.h>
 #include <standin/Plugins.h>
 
 #include <algorithm>
@@ -62,6 +64,46 @@ std::vector<LoadedPlugin> &loaded() {
 std::string nameOf(VObject object) { return VFnPlugin(object).name().asUTF8(); }
 
 void reportPythonException() { TpythonInterpreter::interpreter().catchAndReportException(); }
+
+// Runs a step of loading or unloading the plug-in as an operation of the
+// host, so that its exception is reported as the plug-in's. False when it
+// failed, with ": <the exception>" in `why` when it raised one.
+template <class Step>
+bool runStep(const VObject &object, const char *doing, std::string *why, Step step) {
+  auto describe = [&] { return standin::Operation::Description{nameOf(object), doing}; };
+  standin::Doing<decltype(describe)> operation(nullptr, nullptr, describe);
+  if (step()) return true;
+  reportPythonException();
+  if (why && !operation.failure().empty()) *why = ": " + operation.failure();
+  return false;
+}
+
+// The checker's findings on the loaded plug-in, each "file:line: message",
+// its own file shown as `file`. A checker that fails is reported, and its
+// failure is the one finding.
+std::vector<std::string> check(PyObject *module, const VObject &object, const std::string &file) {
+  std::vector<std::string> findings;
+  std::string why;
+  bool checked = runStep(object, "checking the plug-in", &why, [&] {
+    PyObject *checker = PyImport_ImportModule("openvorla.check");
+    PyObject *lines = checker ? PyObject_CallMethod(checker, "check_plugin", "Oss", module,
+                                                    nameOf(object).c_str(), file.c_str())
+                              : nullptr;
+    Py_XDECREF(checker);
+    PyObject *fast = lines ? PySequence_Fast(lines, "check_plugin() returns a list") : nullptr;
+    Py_XDECREF(lines);
+    for (Py_ssize_t i = 0; fast && i < PySequence_Fast_GET_SIZE(fast); ++i) {
+      const char *line = PyUnicode_AsUTF8(PySequence_Fast_GET_ITEM(fast, i));
+      if (!line) break;
+      findings.push_back(line);
+    }
+    Py_XDECREF(fast);
+    return !PyErr_Occurred();
+  });
+  // Not finding anything is no pass when the checks could not look.
+  if (!checked) findings.assign(1, file + ":1: the checks failed" + why);
+  return findings;
+}
 
 // Executes the file as a new module, entered in sys.modules under `name` so
 // that the plug-in's classes know their module. The file is compiled here
@@ -149,7 +191,15 @@ void forgetPlugin(const VObject &object) {
 
 }  // namespace
 
-std::string loadPlugin(const std::string &file, std::string *name) {
+std::string warning(const std::string &finding) {
+  // "file:line: message" -> "file:line: warning: message"
+  std::string::size_type colon = finding.find(": ");
+  if (colon == std::string::npos) return "warning: " + finding;
+  return finding.substr(0, colon + 2) + "warning: " + finding.substr(colon + 2);
+}
+
+std::string loadPlugin(const std::string &file, std::string *name,
+                       std::vector<std::string> *findings) {
   namespace fs = std::filesystem;
   std::error_code error;
   fs::path path = fs::weakly_canonical(fs::absolute(file), error);
@@ -161,23 +211,29 @@ std::string loadPlugin(const std::string &file, std::string *name) {
   VObject object = standin::loadPlugin(path.stem().c_str(), path.parent_path().c_str());
   *name = nameOf(object);
   PyObject *folder = addFolder(path.parent_path().string());
-  PyObject *module = importFile(*name, path.string());
-  if (!module) {
-    reportPythonException();
+  PyObject *module = nullptr;
+  std::string why;
+  if (!runStep(object, "loading the plug-in", &why,
+               [&] { return (module = importFile(*name, path.string())) != nullptr; })) {
     forgetPlugin(object);
     removeFolder(folder);
-    return "The plug-in file '" + file + "' failed to import";
+    return "The plug-in file '" + file + "' failed to import" + why;
   }
-  if (!callEntry(module, "initializePlugin", *name, false)) {
-    reportPythonException();
+  if (!runStep(object, "loading the plug-in", &why,
+               [&] { return callEntry(module, "initializePlugin", *name, false); })) {
     deleteObjectsOf(*name, false);
     forgetPlugin(object);
     forgetModule(module);
     removeFolder(folder);
-    return "initializePlugin of the plug-in '" + *name + "' failed";
+    return "initializePlugin of the plug-in '" + *name + "' failed" + why;
   }
   *name = nameOf(object);
   loaded().push_back({path.string(), object, module, folder});
+  std::vector<std::string> found = check(module, object, file);
+  if (findings)
+    *findings = std::move(found);
+  else
+    for (const std::string &finding : found) Tlog::write(warning(finding));
   return {};
 }
 
@@ -191,7 +247,8 @@ std::string unloadPlugin(const std::string &name) {
   deleteObjectsOf(name, true);
   // A failing uninitializePlugin is reported; the plug-in goes all the same,
   // since the host takes back everything it registered.
-  if (!callEntry(plugin.module, "uninitializePlugin", name, true)) reportPythonException();
+  runStep(plugin.object, "unloading the plug-in", nullptr,
+          [&] { return callEntry(plugin.module, "uninitializePlugin", name, true); });
   forgetPlugin(plugin.object);
   forgetModule(plugin.module);
   removeFolder(plugin.folder);

@@ -164,6 +164,27 @@ PyObject *registered(PyObject *, PyObject *) {
   });
 }
 
+// The script objects the plug-in registered, for the checker: what the host
+// calls them for and, for a creator, the plug-in class of what it must return.
+PyObject *callbacks(PyObject *, PyObject *args) {
+  const char *plugin;
+  if (!PyArg_ParseTuple(args, "s:callbacks", &plugin)) return nullptr;
+  PyObject *list = PyList_New(0);
+  for (const standin::RegistrationInfo &r : standin::registrations()) {
+    if (r.plugin != plugin) continue;
+    for (const standin::RegisteredCallback &c : r.callbacks) {
+      if (!c.script || !list) continue;
+      PyObject *makes = c.makes.empty() ? Py_NewRef(Py_None) : str(c.makes);
+      PyObject *item = makes ? Py_BuildValue("(sssON)", r.kind.c_str(), r.name.c_str(),
+                                             c.role.c_str(), c.object, makes)
+                             : nullptr;
+      if (!item || PyList_Append(list, item) < 0) Py_CLEAR(list);
+      Py_XDECREF(item);
+    }
+  }
+  return list;
+}
+
 // --- nodes and attributes ---
 
 PyObject *create_node(PyObject *, PyObject *args, PyObject *kwargs) {
@@ -412,6 +433,10 @@ PyMethodDef kFunctions[] = {
     {"plugins", plugins, METH_NOARGS, "plugins() -> [name, ...] of the loaded plug-ins"},
     {"registered", registered, METH_NOARGS,
      "registered() -> [(kind, name, plugin), ...] of every registration"},
+    {"callbacks", callbacks, METH_VARARGS,
+     "callbacks(plugin) -> [(kind, name, role, object, makes), ...]\n\nThe script objects "
+     "the plug-in registered: 'creator', 'initializer', ...\nof each registration, and for a "
+     "creator the plug-in class it must make\n('VPxNode', ...), otherwise None."},
     {"create_node", withKeywords(create_node), METH_VARARGS | METH_KEYWORDS,
      "create_node(type, name=None) -> name\n\nWithout a name: <type>1, <type>2, ..."},
     {"delete_node", delete_node, METH_VARARGS, "delete_node(name)"},

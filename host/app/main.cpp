@@ -22,19 +22,29 @@ namespace {
 
 const char kSynopsis[] =
     "usage: vorla [--plugin FILE]... [--threads N] [SCRIPT [ARGS...]]\n"
+    "       vorla --check PLUGIN...\n"
     "       vorla --help\n";
 const char kDescription[] =
     "\n"
     "Loads each plug-in FILE (a Python file defining initializePlugin and\n"
     "uninitializePlugin), runs the host SCRIPT with sys.argv = [SCRIPT, ARGS...],\n"
     "then unloads the plug-ins. The script drives the application through the\n"
-    "module 'vorla' (see help(vorla)).\n"
+    "module 'vorla' (see help(vorla)). Each plug-in is checked as it loads, and\n"
+    "what the checks find is logged as warnings.\n"
     "\n"
     "  --plugin FILE  load a plug-in before the script; may be repeated\n"
     "  --threads N    host threads that evaluate the graph (default: one per core)\n"
+    "  --check        load each PLUGIN alone, check it, unload it, and print what\n"
+    "                 the checks find as 'file:line: message': methods whose names\n"
+    "                 are near misses of an operation, operations that cannot take\n"
+    "                 the application's arguments, __init__ methods that do not\n"
+    "                 call their base's, classes registered under a kind whose\n"
+    "                 class they do not derive from, creators that return\n"
+    "                 something else than that class\n"
     "  --help         show this text\n"
     "\n"
-    "Exit status: 0, or 1 when a plug-in failed to load or the script raised,\n"
+    "Exit status: 0, or 1 when a plug-in failed to load or the script raised\n"
+    "(with --check: when a plug-in failed to load or a check found anything),\n"
     "2 for a usage error.\n";
 
 struct Options {
@@ -42,6 +52,7 @@ struct Options {
   int threads = 0;
   std::vector<std::string> script;  // the script's path and its arguments
   bool help = false;
+  bool check = false;  // the plug-ins are to be checked, and nothing run
 };
 
 // False with a message for a usage error.
@@ -52,6 +63,8 @@ bool parseCommandLine(int argc, char **argv, Options &options, std::string &erro
     std::string arg = argv[i];
     if (arg == "--help" || arg == "-h") {
       options.help = true;
+    } else if (arg == "--check") {
+      options.check = true;
     } else if (arg == "--plugin" || arg == "--threads") {
       if (i + 1 == argc) {
         error = arg + " needs a value";
@@ -72,10 +85,16 @@ bool parseCommandLine(int argc, char **argv, Options &options, std::string &erro
     } else if (arg.size() > 1 && arg[0] == '-') {
       error = "unknown option '" + arg + "'";
       return false;
+    } else if (options.check) {  // no script: every file is a plug-in to check
+      options.plugins.push_back(arg);
     } else {
       options.script.assign(argv + i, argv + argc);
       break;
     }
+  }
+  if (options.check && !options.help && options.plugins.empty()) {
+    error = "--check needs a plug-in file";
+    return false;
   }
   return true;
 }
@@ -143,6 +162,28 @@ bool preparePackage(const Options &options) {
   }
   Py_DECREF(module);
   return true;
+}
+
+// Loads each plug-in alone, prints what the checks find, and unloads it. 1
+// when a plug-in failed to load or the checks found anything.
+int checkPlugins(const std::vector<std::string> &files) {
+  int status = 0;
+  for (const std::string &file : files) {
+    TpythonLock lock;
+    std::string name;
+    std::vector<std::string> findings;
+    std::string failure = vorla::loadPlugin(file, &name, &findings);
+    if (!failure.empty()) {
+      std::fprintf(stderr, "vorla: %s\n", failure.c_str());
+      status = 1;
+      continue;
+    }
+    for (const std::string &finding : findings) std::printf("%s\n", finding.c_str());
+    std::fflush(stdout);
+    if (!findings.empty()) status = 1;
+    vorla::unloadPlugin(name);
+  }
+  return status;
 }
 
 // The exit status SystemExit asks for, printing a message it carries.
@@ -222,9 +263,10 @@ int main(int argc, char **argv) {
   PyThreadState *mainThread = PyEval_SaveThread();
 
   int status = 0;
+  if (options.check) status = checkPlugins(options.plugins);
   // A plug-in the command line names must load: without it the script would
   // run in an application that lacks what it expects.
-  for (const std::string &file : options.plugins) {
+  for (const std::string &file : options.check ? std::vector<std::string>() : options.plugins) {
     TpythonLock lock;
     std::string name;
     std::string failure = vorla::loadPlugin(file, &name);

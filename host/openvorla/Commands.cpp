@@ -38,7 +38,6 @@ namespace standin {
 using namespace OPENVORLA_NAMESPACE;
 using host::failed;
 using host::failure;
-using host::guarded;
 using host::guardedVoid;
 using host::quoted;
 
@@ -156,14 +155,22 @@ std::string commandLine(const std::string &name, const std::vector<Value> &args)
 
 VStatus Commands::run(const std::string &name, const std::vector<Value> &args,
                       CommandResult *result) {
+  // Found again only when something is reported.
+  auto running = [&name](const char *doing) {
+    return [&name, doing] {
+      return Operation::Description{
+          host::pluginOf({"Command", "ConstraintCommand", "ContextCommand"}, name),
+          doing + quoted(name)};
+    };
+  };
   VPxCommand *command = nullptr;
-  VStatus status = guardedVoid([&] { command = standin::createCommand(name.c_str()); });
+  VStatus status = host::inPluginVoid(nullptr, nullptr, running("creating the command "),
+                                      [&] { command = standin::createCommand(name.c_str()); });
   if (!command) {
-    if (!status) return status;
     if (!host::isRegistered({"Command", "ConstraintCommand", "ContextCommand"}, name))
       return failure(VStatus::kNotFound, "No command named " + quoted(name) + " is registered");
-    return failure(VStatus::kFailure,
-                   "The creator of the command " + quoted(name) + " made no command");
+    return host::madeNone("The creator of the command " + quoted(name) + " made no command",
+                          status);
   }
   VArgList list;
   status = argumentsFor(name, *command, args, &list);
@@ -173,9 +180,12 @@ VStatus Commands::run(const std::string &name, const std::vector<Value> &args,
   }
   command->setCommandString(commandLine(name, args).c_str());
   VPxCommand::clearResult();
-  status = guarded([&] { return command->doIt(list); });
+  status = host::inPlugin(command, "doIt", running("running the command "),
+                          [&] { return command->doIt(list); });
   bool undoable = false;
-  if (status) status = guardedVoid([&] { undoable = command->isUndoable(); });
+  if (status)
+    status = host::inPluginVoid(command, "isUndoable", running("running the command "),
+                                [&] { undoable = command->isUndoable(); });
   if (!status) {
     deleteCommands({{name, command}});
     return failed("The command " + quoted(name), status);
@@ -199,7 +209,7 @@ namespace {
 // succeeds, back on `from` when it fails.
 template <typename Call>
 VStatus step(std::mutex &mutex, std::vector<Kept> &from, std::vector<Kept> &to, const char *nothing,
-             const char *doing, Call call) {
+             const char *doing, const char *method, Call call) {
   Kept kept;
   {
     std::lock_guard<std::mutex> guard(mutex);
@@ -207,7 +217,14 @@ VStatus step(std::mutex &mutex, std::vector<Kept> &from, std::vector<Kept> &to, 
     kept = from.back();
     from.pop_back();
   }
-  VStatus status = guarded([&] { return call(kept.command); });
+  VStatus status = host::inPlugin(
+      kept.command, method,
+      [&] {
+        return Operation::Description{
+            host::pluginOf({"Command", "ConstraintCommand", "ContextCommand"}, kept.name),
+            host::lowered(doing) + " the command " + quoted(kept.name)};
+      },
+      [&] { return call(kept.command); });
   std::lock_guard<std::mutex> guard(mutex);
   if (!status) {
     from.push_back(kept);
@@ -221,12 +238,12 @@ VStatus step(std::mutex &mutex, std::vector<Kept> &from, std::vector<Kept> &to, 
 
 VStatus Commands::undo() {
   return step(impl_->mutex, impl_->undo, impl_->redo, "There is nothing to undo", "Undoing",
-              [](VPxCommand *c) { return c->undoIt(); });
+              "undoIt", [](VPxCommand *c) { return c->undoIt(); });
 }
 
 VStatus Commands::redo() {
   return step(impl_->mutex, impl_->redo, impl_->undo, "There is nothing to redo", "Redoing",
-              [](VPxCommand *c) { return c->redoIt(); });
+              "redoIt", [](VPxCommand *c) { return c->redoIt(); });
 }
 
 void Commands::flush() {

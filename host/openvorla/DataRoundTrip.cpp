@@ -16,7 +16,6 @@ namespace standin {
 using namespace OPENVORLA_NAMESPACE;
 using host::failed;
 using host::failure;
-using host::guarded;
 using host::guardedVoid;
 using host::quoted;
 
@@ -47,18 +46,31 @@ VArgList words(const std::string &text) {
   return args;
 }
 
+// What the round trip is doing with the data type, for the reports of its
+// plug-in's failures.
+struct Step {
+  const std::string &type;
+  const char *doing;  // "reading", ...
+  const char *how;    // " from ASCII", ...
+  Operation::Description operator()() const {
+    return {host::pluginOf({"Data"}, type),
+            std::string(doing) + " the data type " + quoted(type) + how};
+  }
+};
+
 class Instance {
  public:
   ~Instance() {
     if (fData) guardedVoid([&] { standin::deleteData(fData); });
   }
   VStatus make(const std::string &type) {
-    VStatus status = guardedVoid([&] { fData = standin::createData(VString(type.c_str())); });
-    if (fData || !status) return status;
+    VStatus status = host::inPluginVoid(nullptr, nullptr, Step{type, "creating", ""}, [&] {
+      fData = standin::createData(VString(type.c_str()));
+    });
+    if (fData) return status;
     if (!host::isRegistered({"Data"}, type))
       return failure(VStatus::kNotFound, "No data type named " + quoted(type) + " is registered");
-    return failure(VStatus::kFailure,
-                   "The creator of the data type " + quoted(type) + " made no data");
+    return host::madeNone("The creator of the data type " + quoted(type) + " made no data", status);
   }
   VPxData &operator*() { return *fData; }
   VPxData *operator->() { return fData; }
@@ -77,15 +89,18 @@ VStatus roundTripData(const std::string &dataType, const std::string &text, std:
   if (!status) return status;
   VArgList args = words(text);
   unsigned int last = 0;
-  status = guarded([&] { return read->readASCII(args, last); });
+  status = host::inPlugin(&*read, "readASCII", Step{dataType, "reading", " from ASCII"},
+                          [&] { return read->readASCII(args, last); });
   if (!status) return failed("Reading" + what + " from ASCII", status);
   status = copy.make(dataType);
   if (!status) return status;
-  status = guardedVoid([&] { copy->copy(*read); });
+  status =
+      host::inPluginVoid(&*copy, "copy", Step{dataType, "copying", ""}, [&] { copy->copy(*read); });
   if (!status) return failed("Copying" + what, status);
   for (auto [data, out] : {std::make_pair(&read, written), std::make_pair(&copy, copied)}) {
     std::ostringstream stream;
-    status = guarded([&] { return (*data)->writeASCII(stream); });
+    status = host::inPlugin(&**data, "writeASCII", Step{dataType, "writing", " as ASCII"},
+                            [&] { return (*data)->writeASCII(stream); });
     if (!status) return failed("Writing" + what + " as ASCII", status);
     if (out) *out = stream.str();
   }

@@ -18,7 +18,6 @@ namespace standin {
 using namespace OPENVORLA_NAMESPACE;
 using host::failed;
 using host::failure;
-using host::guarded;
 using host::guardedVoid;
 using host::quoted;
 
@@ -45,19 +44,25 @@ std::vector<std::pair<std::string, std::string>> pairsOf(const std::string &opti
 VStatus transfer(const std::string &path, const std::string &name, const std::string &options,
                  bool write) {
   if (path.empty()) return failure(VStatus::kInvalidParameter, "A scene file needs a path");
+  const std::string doing = (write ? "writing " : "reading ") + quoted(path) +
+                            " with the file translator " + quoted(name);
+  auto describe = [&] {
+    return Operation::Description{host::pluginOf({"FileTranslator"}, name), doing};
+  };
   VPxFileTranslator *translator = nullptr;
-  VStatus status = guardedVoid([&] { translator = standin::createTranslator(name.c_str()); });
+  VStatus status = host::inPluginVoid(
+      nullptr, nullptr, describe, [&] { translator = standin::createTranslator(name.c_str()); });
   if (!translator) {
-    if (!status) return status;
     if (!host::isRegistered({"FileTranslator"}, name))
       return failure(VStatus::kNotFound,
                      "No file translator named " + quoted(name) + " is registered");
-    return failure(VStatus::kFailure,
-                   "The creator of the file translator " + quoted(name) + " made no translator");
+    return host::madeNone(
+        "The creator of the file translator " + quoted(name) + " made no translator", status);
   }
   const std::string what = "The file translator " + quoted(name);
   bool able = false;
-  status = guardedVoid(
+  status = host::inPluginVoid(
+      translator, write ? "haveWriteMethod" : "haveReadMethod", describe,
       [&] { able = write ? translator->haveWriteMethod() : translator->haveReadMethod(); });
   if (status && !able)
     status = failure(VStatus::kNotImplemented,
@@ -70,7 +75,7 @@ VStatus transfer(const std::string &path, const std::string &name, const std::st
     standin::setFileAccessMode(mode);
     const VString given(
         Files::mergeOptions(translatorDefaultOptions(name.c_str()), options).c_str());
-    status = guarded([&] {
+    status = host::inPlugin(translator, write ? "writer" : "reader", describe, [&] {
       return write ? translator->writer(file, given, mode) : translator->reader(file, given, mode);
     });
     standin::setFileAccessMode(VPxFileTranslator::kUnknownAccessMode);

@@ -168,9 +168,11 @@ std::shared_ptr<const NodeType> GraphState::nodeType(const std::string &typeName
   type->serial = serial;
   // Whether a script's creator makes the nodes.
   for (const RegistrationInfo &r : standin::registrations())
-    if (r.name == typeName && (r.kind == "Node" || r.kind == "Shape" || r.kind == "Transform"))
+    if (r.name == typeName && (r.kind == "Node" || r.kind == "Shape" || r.kind == "Transform")) {
+      type->plugin = r.plugin;
       for (const RegisteredCallback &c : r.callbacks)
         if (c.role == "creator" && c.script) type->scripted = true;
+    }
   if (!declared.parent.empty()) {
     std::shared_ptr<const NodeType> parent = nodeType(declared.parent, status);
     if (!parent) return nullptr;
@@ -256,11 +258,15 @@ VStatus Graph::createNode(const std::string &type, const std::string &name, std:
   std::shared_ptr<const graph::NodeType> nodeType = impl_->nodeType(type, &status);
   if (!nodeType) return status;
   VPxNode *raw = nullptr;
-  status = host::guardedVoid([&] { raw = standin::createNode(type.c_str()); });
+  status = host::inPluginVoid(
+      nullptr, nullptr,
+      [&] {
+        return Operation::Description{nodeType->plugin,
+                                      "creating a node of the type " + quoted(type)};
+      },
+      [&] { raw = standin::createNode(type.c_str()); });
   if (!raw)
-    return status ? failure(VStatus::kFailure,
-                            "The creator of the node type " + quoted(type) + " made no node")
-                  : status;
+    return host::madeNone("The creator of the node type " + quoted(type) + " made no node", status);
 
   graph::NodePtr node;
   {
@@ -284,7 +290,13 @@ VStatus Graph::createNode(const std::string &type, const std::string &name, std:
     standin::deleteNode(raw);
     return failure(VStatus::kFailure, "A node named " + quoted(name) + " already exists");
   }
-  host::guardedVoid([&] { raw->postConstructor(); });
+  // The node is made whatever its postConstructor does; a failure is in the log.
+  host::inPluginVoid(
+      raw, "postConstructor",
+      [&] {
+        return Operation::Description{nodeType->plugin, "creating the node " + quoted(node->name)};
+      },
+      [&] { raw->postConstructor(); });
   if (made) *made = node->name;
   return VStatus::kSuccess;
 }

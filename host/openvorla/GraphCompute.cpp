@@ -120,10 +120,16 @@ VStatus GraphState::compute(const NodePtr &node, int attribute) {
   tFrame = &frame;
   ++node->computeCount;
   if (tEvaluation.run) tEvaluation.run->noteCompute();
-  VStatus status = guarded([&] { return node->node->compute(plug, node->block); });
+  auto computing = [&] {
+    return Operation::Description{node->type->plugin,
+                                  "computing " + quoted(node->plugName(attribute))};
+  };
+  VStatus status = host::inPlugin(node->node, "compute", computing,
+                                  [&] { return node->node->compute(plug, node->block); });
   // Left to the host: what the node's kind computes, if anything.
   if (status == VStatus::kUnknownParameter && !frame.inputFailed) {
-    VStatus made = guarded([&] { return bases::compute(*node, attribute); });
+    VStatus made = host::inPlugin(node->node, nullptr, computing,
+                                  [&] { return bases::compute(*node, attribute); });
     if (made != VStatus::kUnknownParameter) status = made;
   }
   tFrame = frame.outer;

@@ -62,6 +62,7 @@ struct NodeType {
   std::vector<AttributeSpec> attributes;  // the parent's first, then in declaration order
   std::vector<std::vector<int>> affectedBy;  // per attribute, those whose change dirties it
   bool scripted = false;                     // its nodes are made by a script's creator
+  std::string plugin;                        // the plug-in that registered it
 
   // By long or brief name, or by object; -1 when the type has none.
   int find(const std::string &name) const;

@@ -138,6 +138,18 @@ double stored(const graph::AttributeSpec &spec, double value) {
   return value;
 }
 
+// Tells a node of a connection made or broken: what it answers is its own to
+// know, and a failure is in the log.
+template <typename Call>
+void tell(const graph::Node &node, const char *method, const std::string &doing, Call call) {
+  host::inPlugin(
+      node.node, method,
+      [&] {
+        return Operation::Description{node.type->plugin, doing};
+      },
+      call);
+}
+
 }  // namespace
 
 VStatus Graph::setAttr(const std::string &plug, const Value &value) {
@@ -237,8 +249,11 @@ VStatus Graph::connect(const std::string &source, const std::string &destination
   VPlug fromPlug(from->node->thisVObject(), from->type->attributes[fromAttribute].object);
   VPlug toPlug(to->node->thisVObject(), to->type->attributes[toAttribute].object);
   // What the nodes answer is theirs to know; the connection stands.
-  graph::guarded([&] { return from->node->connectionMade(fromPlug, toPlug, true); });
-  graph::guarded([&] { return to->node->connectionMade(toPlug, fromPlug, false); });
+  const std::string doing = "connecting " + quoted(source) + " to " + quoted(destination);
+  tell(*from, "connectionMade", doing,
+       [&] { return from->node->connectionMade(fromPlug, toPlug, true); });
+  tell(*to, "connectionMade", doing,
+       [&] { return to->node->connectionMade(toPlug, fromPlug, false); });
   return VStatus::kSuccess;
 }
 
@@ -262,8 +277,11 @@ VStatus Graph::disconnect(const std::string &source, const std::string &destinat
   }
   VPlug fromPlug(from->node->thisVObject(), from->type->attributes[fromAttribute].object);
   VPlug toPlug(to->node->thisVObject(), to->type->attributes[toAttribute].object);
-  graph::guarded([&] { return from->node->connectionBroken(fromPlug, toPlug, true); });
-  graph::guarded([&] { return to->node->connectionBroken(toPlug, fromPlug, false); });
+  const std::string doing = "disconnecting " + quoted(source) + " from " + quoted(destination);
+  tell(*from, "connectionBroken", doing,
+       [&] { return from->node->connectionBroken(fromPlug, toPlug, true); });
+  tell(*to, "connectionBroken", doing,
+       [&] { return to->node->connectionBroken(toPlug, fromPlug, false); });
   return VStatus::kSuccess;
 }
 

@@ -11,6 +11,7 @@
 
 #include <standin/Nodes.h>
 #include <standin/Objects.h>
+#include <standin/Operation.h>
 #include <standin/Registry.h>
 #include <standin/ScriptCallables.h>
 
@@ -41,50 +42,126 @@ struct KindTraits {
   Namespace space;
   std::vector<CallbackRole> required;
   bool uniqueId;  // its id must differ from the others of its kind or namespace
+  // The plug-in class the creator's instances are made as; null when the
+  // kind's creator makes no instance of a plug-in class.
+  const char *makes;
 };
 
 const KindTraits &traits(RegistrationKind kind) {
   using R = CallbackRole;
   static const KindTraits table[] = {
-      {"Command", "command", Namespace::kCommands, {R::kCreator}, false},
-      {"ControlCommand", "control command", Namespace::kCommands, {R::kCreator}, false},
+      {"Command", "command", Namespace::kCommands, {R::kCreator}, false, "VPxCommand"},
+      {"ControlCommand",
+       "control command",
+       Namespace::kCommands,
+       {R::kCreator},
+       false,
+       "VPxControlCommand"},
       {"ModelEditorCommand",
        "model editor command",
        Namespace::kCommands,
        {R::kCreator, R::kPaneCreator},
-       false},
-      {"ConstraintCommand", "constraint command", Namespace::kCommands, {R::kCreator}, false},
-      {"ContextCommand", "context command", Namespace::kCommands, {R::kCreator}, false},
-      {"Node", "node type", Namespace::kTypes, {R::kCreator, R::kInitializer}, true},
-      {"Shape", "shape type", Namespace::kTypes, {R::kCreator, R::kInitializer}, true},
+       false,
+       "VPxModelEditorCommand"},
+      {"ConstraintCommand",
+       "constraint command",
+       Namespace::kCommands,
+       {R::kCreator},
+       false,
+       "VPxConstraintCommand"},
+      {"ContextCommand",
+       "context command",
+       Namespace::kCommands,
+       {R::kCreator},
+       false,
+       "VPxContextCommand"},
+      {"Node", "node type", Namespace::kTypes, {R::kCreator, R::kInitializer}, true, "VPxNode"},
+      {"Shape",
+       "shape type",
+       Namespace::kTypes,
+       {R::kCreator, R::kInitializer},
+       true,
+       "VPxSurfaceShape"},
       {"Transform",
        "transform type",
        Namespace::kTypes,
        {R::kCreator, R::kInitializer, R::kMatrixCreator},
-       true},
-      {"Data", "data type", Namespace::kTypes, {R::kCreator}, true},
-      {"Device", "device", Namespace::kOwn, {R::kCreator}, false},
-      {"IkSolver", "IK solver", Namespace::kOwn, {R::kCreator}, false},
-      {"CacheFormat", "cache format", Namespace::kOwn, {R::kCreator}, false},
-      {"DragAndDropBehavior", "drag and drop behavior", Namespace::kOwn, {R::kCreator}, false},
+       true,
+       "VPxTransform"},
+      {"Data", "data type", Namespace::kTypes, {R::kCreator}, true, "VPxData"},
+      {"Device", "device", Namespace::kOwn, {R::kCreator}, false, "VPxMidiInputDevice"},
+      {"IkSolver", "IK solver", Namespace::kOwn, {R::kCreator}, false, "VPxIkSolverNode"},
+      {"CacheFormat", "cache format", Namespace::kOwn, {R::kCreator}, false, "VPxCacheFormat"},
+      {"DragAndDropBehavior",
+       "drag and drop behavior",
+       Namespace::kOwn,
+       {R::kCreator},
+       false,
+       "VPxDragAndDropBehavior"},
       {"AttributePatternFactory",
        "attribute pattern factory",
        Namespace::kOwn,
        {R::kCreator},
-       false},
-      {"Renderer", "renderer", Namespace::kOwn, {R::kCreator}, false},
-      {"MaterialInfo", "material information", Namespace::kOwn, {R::kCreator}, false},
-      {"BakeEngine", "bake engine", Namespace::kOwn, {R::kCreator}, false},
-      {"Evaluator", "evaluator", Namespace::kOwn, {R::kCreator}, true},
-      {"TopologyEvaluator", "topology evaluator", Namespace::kOwn, {R::kCreator}, true},
-      {"FileTranslator", "file translator", Namespace::kOwn, {R::kCreator}, false},
-      {"URIFileResolver", "URI file resolver", Namespace::kOwn, {R::kCreator}, false},
-      {"UIStrings", "string resource set", Namespace::kOwn, {R::kStringRegistration}, false},
-      {"ImageFile", "image file format", Namespace::kOwn, {R::kCreator}, false},
-      {"RenderPassImpl", "render pass implementation", Namespace::kOwn, {R::kCreator}, false},
-      {"AnimCurveInterpolator", "anim curve interpolator", Namespace::kOwn, {R::kCreator}, true},
+       false,
+       "VPxAttributePatternFactory"},
+      {"Renderer", "renderer", Namespace::kOwn, {R::kCreator}, false, nullptr},
+      {"MaterialInfo",
+       "material information",
+       Namespace::kOwn,
+       {R::kCreator},
+       false,
+       "VPxMaterialInformation"},
+      {"BakeEngine", "bake engine", Namespace::kOwn, {R::kCreator}, false, "VPxBakeEngine"},
+      {"Evaluator", "evaluator", Namespace::kOwn, {R::kCreator}, true, nullptr},
+      {"TopologyEvaluator", "topology evaluator", Namespace::kOwn, {R::kCreator}, true, nullptr},
+      {"FileTranslator",
+       "file translator",
+       Namespace::kOwn,
+       {R::kCreator},
+       false,
+       "VPxFileTranslator"},
+      {"URIFileResolver",
+       "URI file resolver",
+       Namespace::kOwn,
+       {R::kCreator},
+       false,
+       "VPxFileResolver"},
+      {"UIStrings",
+       "string resource set",
+       Namespace::kOwn,
+       {R::kStringRegistration},
+       false,
+       nullptr},
+      {"ImageFile", "image file format", Namespace::kOwn, {R::kCreator}, false, "VPxImageFile"},
+      {"RenderPassImpl",
+       "render pass implementation",
+       Namespace::kOwn,
+       {R::kCreator},
+       false,
+       "VPxRenderPassImpl"},
+      {"AnimCurveInterpolator",
+       "anim curve interpolator",
+       Namespace::kOwn,
+       {R::kCreator},
+       true,
+       "VPxAnimCurveInterpolator"},
   };
   return table[static_cast<int>(kind)];
+}
+
+// The plug-in class a callback's instances are made as, or null: the host
+// checks what a script's creator returns against it.
+const char *makes(RegistrationKind kind, CallbackRole role) {
+  switch (role) {
+    case CallbackRole::kCreator:
+      return traits(kind).makes;
+    case CallbackRole::kToolCommandCreator:
+      return "VPxToolCommand";
+    case CallbackRole::kMatrixCreator:
+      return "VPxTransformationMatrix";
+    default:
+      return nullptr;
+  }
 }
 
 const char *roleName(CallbackRole role) {
@@ -348,11 +425,12 @@ unsigned int matrixTypeId(const VObject &plugin, unsigned int transformTypeId) {
 
 namespace {
 
-// An instance made by the callback as a `base`; null if it made none.
-void *make(const Registration &r, const Callback &creator, const char *base) {
+// An instance made by the callback, as the class its role makes; null if it
+// made none.
+void *make(const Registration &r, const Callback &creator) {
   if (!creator.script) return reinterpret_cast<VCreatorFunction>(creator.function)();
   if (const standin::ScriptCallableHooks *hooks = gHooks.load())
-    return hooks->create(creator.script, base);
+    return hooks->create(creator.script, makes(r.kind, creator.role));
   Tlog::write(std::string("No scripting engine to run the creator of ") + describe(r).asUTF8());
   return nullptr;
 }
@@ -408,7 +486,8 @@ std::vector<RegistrationInfo> registrations() {
                           e->flags,
                           {}};
     for (const Callback &c : e->callbacks)
-      info.callbacks.push_back({roleName(c.role), c.script != nullptr, c.script});
+      info.callbacks.push_back({roleName(c.role), c.script != nullptr, c.script,
+                                makes(e->kind, c.role) ? makes(e->kind, c.role) : ""});
     out.push_back(std::move(info));
   }
   return out;
@@ -417,7 +496,7 @@ std::vector<RegistrationInfo> registrations() {
 VPxNode *createNode(const VString &typeName) {
   RegistrationPtr r = findNamed(typeName, isNodeKind);
   if (!r) return nullptr;
-  auto *node = static_cast<VPxNode *>(make(*r, *r->find(CallbackRole::kCreator), "VPxNode"));
+  auto *node = static_cast<VPxNode *>(make(*r, *r->find(CallbackRole::kCreator)));
   if (!node) return nullptr;
   VFn::Type type = r->kind == RegistrationKind::kTransform ? VFn::kTransform
                    : r->kind == RegistrationKind::kShape   ? VFn::kDagNode
@@ -450,19 +529,27 @@ VStatus initializeNode(const VString &typeName) {
     ~Declaring() { endNodeType(); }
   };
   VStatus status = VStatus::kSuccess;
+  std::string why;
   {
     Declaring declaring(nodeKind(typeName.asUTF8()));
     if (!init.script) {
       status = reinterpret_cast<VInitializeFunction>(init.function)();
     } else {
+      Doing initializing(nullptr, nullptr, [&] {
+        return Operation::Description{pluginName(r->plugin).asUTF8(),
+                                      "initializing " + std::string(describe(*r).asUTF8())};
+      });
       const ScriptCallableHooks *hooks = gHooks.load();
       if (!hooks || !hooks->run(init.script)) status = VStatus::kFailure;
+      why = initializing.failure();
     }
   }
   if (status) return status;
-  // A script's failure is in the log; its status says no more.
+  // A script's failure is in the log; its status says no more than the
+  // exception it raised.
   VString message = VString("The initializer of ") + describe(*r) + " failed";
   if (!init.script) message += VString(": ") + status.errorString();
+  if (!why.empty()) message += VString(": ") + why.c_str();
   return VStatus(status.statusCode(), message);
 }
 
@@ -476,7 +563,7 @@ VPxCommand *createCommand(const VString &commandName) {
     });
     role = CallbackRole::kToolCommandCreator;
   }
-  return r ? static_cast<VPxCommand *>(make(*r, *r->find(role), "VPxCommand")) : nullptr;
+  return r ? static_cast<VPxCommand *>(make(*r, *r->find(role))) : nullptr;
 }
 
 VStatus commandSyntax(const VString &commandName, VSyntax *syntax, bool *given) {
@@ -514,14 +601,14 @@ VPxData *createData(const VTypeId &typeId) {
   RegistrationPtr r = theRegistry().find([&](const Registration &e) {
     return e.kind == RegistrationKind::kData && e.typeId == typeId.id();
   });
-  return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator), "VPxData")) : nullptr;
+  return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator))) : nullptr;
 }
 
 VPxData *createData(const VString &typeName) {
   RegistrationPtr r = findNamed(typeName, [](RegistrationKind k) {
     return k == RegistrationKind::kData;
   });
-  return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator), "VPxData")) : nullptr;
+  return r ? static_cast<VPxData *>(make(*r, *r->find(CallbackRole::kCreator))) : nullptr;
 }
 
 std::string translatorDefaultOptions(const VString &translatorName) {
@@ -535,9 +622,7 @@ VPxFileTranslator *createTranslator(const VString &translatorName) {
   RegistrationPtr r = findNamed(translatorName, [](RegistrationKind k) {
     return k == RegistrationKind::kFileTranslator;
   });
-  return r ? static_cast<VPxFileTranslator *>(
-                 make(*r, *r->find(CallbackRole::kCreator), "VPxFileTranslator"))
-           : nullptr;
+  return r ? static_cast<VPxFileTranslator *>(make(*r, *r->find(CallbackRole::kCreator))) : nullptr;
 }
 
 void deleteNode(VPxNode *node) { delete node; }

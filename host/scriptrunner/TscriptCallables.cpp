@@ -8,6 +8,12 @@
 
 #include <standin/ScriptCallables.h>
 
+#include <cstring>
+#include <string>
+#include <unordered_map>
+
+#include "Engine.h"
+
 namespace {
 
 // The host may call in while its caller has a Python error pending (a binding
@@ -24,53 +30,75 @@ class PendingError {
   PyObject *fType, *fValue, *fTraceback;
 };
 
-// The class of the package that plug-ins import, or null (no error set) when
-// the package is not loaded.
-PyObject *packageClass(const char *module, const char *cls) {
-  PyObject *name = PyUnicode_FromString(module);
-  PyObject *loaded = name ? PyImport_GetModule(name) : nullptr;
+// The proxy classes of the package that plug-ins import, or null (no error
+// set) when it is not loaded.
+PyObject *proxyModule() {
+  PyObject *name = PyUnicode_FromString("openvorla.OpenVorlaVPx");
+  PyObject *module = name ? PyImport_GetModule(name) : nullptr;
   Py_XDECREF(name);
-  PyObject *found = loaded ? PyObject_GetAttrString(loaded, cls) : nullptr;
-  Py_XDECREF(loaded);
-  if (!found) PyErr_Clear();
+  PyErr_Clear();
+  return module;
+}
+
+// The class's nearest base that is a proxy class of the package: the one
+// whose __init__ makes the C++ object.
+std::string proxyBaseOf(PyTypeObject *type, PyObject *module, const char *fallback) {
+  PyObject *wanted = PyModule_GetNameObject(module);
+  PyObject *mro = type->tp_mro;
+  std::string found = fallback;
+  for (Py_ssize_t i = 0; wanted && mro && i < PyTuple_GET_SIZE(mro); ++i) {
+    auto *base = reinterpret_cast<PyTypeObject *>(PyTuple_GET_ITEM(mro, i));
+    PyObject *name = PyObject_GetAttrString(reinterpret_cast<PyObject *>(base), "__module__");
+    bool proxy = name && PyObject_RichCompareBool(name, wanted, Py_EQ) == 1;
+    Py_XDECREF(name);
+    if (proxy) {
+      found = base->tp_name;
+      break;
+    }
+  }
+  Py_XDECREF(wanted);
+  PyErr_Clear();
   return found;
 }
 
-// Whether `instance` is of the plug-in class `base`, as the package that
-// plug-ins import defines it: 1 if it is, 0 with TypeError set if it is not,
-// -1 when the package is not loaded and cannot tell.
-int isOfBase(PyObject *instance, const char *base) {
-  PyObject *cls = packageClass("openvorla.OpenVorlaVPx", base);
-  if (!cls) return -1;
-  int is = PyObject_IsInstance(instance, cls);
-  Py_DECREF(cls);
-  if (is == 0)
-    PyErr_Format(PyExc_TypeError,
-                 "a %s creator must return an instance of %s or of a class derived from it, "
-                 "not '%.200s'",
-                 base, base, Py_TYPE(instance)->tp_name);
-  return is;
+std::string typeName(PyObject *object) {
+  if (object == Py_None) return "None";
+  const char *name = Py_TYPE(object)->tp_name;
+  return std::string(std::strchr("aeiouAEIOU", name[0]) ? "an " : "a ") + name;
 }
 
-// The C++ address of a proxy instance: its "this" converts to the address.
-// `derived`: the instance is known to be of a plug-in class.
-void *addressOf(PyObject *instance, bool derived) {
+// The C++ address of the instance a creator returned, which must be of the
+// plug-in class `base` as the package that plug-ins import defines it, and
+// have its C++ object: its "this" converts to the address. Null with
+// TypeError set when it is not so.
+void *addressOf(PyObject *instance, const char *base) {
+  PyObject *module = proxyModule();
+  PyObject *cls = module ? PyObject_GetAttrString(module, base) : nullptr;
+  int is = cls ? PyObject_IsInstance(instance, cls) : -1;
+  Py_XDECREF(cls);
+  PyErr_Clear();
+  if (is == 0) {
+    Py_XDECREF(module);
+    PyErr_Format(PyExc_TypeError, "the creator returned %s, not a subclass of %s",
+                 typeName(instance).c_str(), base);
+    return nullptr;
+  }
   PyObject *self = PyObject_GetAttrString(instance, "this");
   if (!self) {
     if (PyErr_ExceptionMatches(PyExc_AttributeError)) {
       PyErr_Clear();
-      if (derived)
-        PyErr_Format(PyExc_TypeError,
-                     "the '%.200s' instance a creator returned has no C++ object: its "
-                     "__init__ must call its base class's __init__",
-                     Py_TYPE(instance)->tp_name);
-      else
+      if (is == 1)
+        PyErr_Format(PyExc_TypeError, "%s did not call %s.__init__", Py_TYPE(instance)->tp_name,
+                     proxyBaseOf(Py_TYPE(instance), module, base).c_str());
+      else  // without the package there is no telling what it is
         PyErr_Format(PyExc_TypeError,
                      "a creator must return an instance of a plug-in class, not '%.200s'",
                      Py_TYPE(instance)->tp_name);
     }
+    Py_XDECREF(module);
     return nullptr;
   }
+  Py_XDECREF(module);
   PyObject *number = PyNumber_Long(self);
   Py_DECREF(self);
   if (!number) return nullptr;
@@ -81,6 +109,18 @@ void *addressOf(PyObject *instance, bool derived) {
   return address;
 }
 
+// The creator's name for a report that has no traceback to take it from,
+// read with the creator's failure set aside.
+std::string creatorName(PyObject *creator) {
+  PendingError failure;
+  PyObject *name = PyObject_GetAttrString(creator, "__qualname__");
+  const char *text = name && PyUnicode_Check(name) ? PyUnicode_AsUTF8(name) : nullptr;
+  std::string out = text ? text : "";
+  Py_XDECREF(name);
+  PyErr_Clear();
+  return out;
+}
+
 void *create(PyObject *creator, const char *base) {
   TpythonLock lock;
   PendingError pending;
@@ -88,8 +128,7 @@ void *create(PyObject *creator, const char *base) {
   if (PyObject *instance = PyObject_CallNoArgs(creator)) {
     // The address is read before ownership moves, so that a failure leaves
     // the instance to Python, which frees it, rather than to nobody.
-    int derived = isOfBase(instance, base);
-    if (derived != 0) address = addressOf(instance, derived == 1);
+    address = addressOf(instance, base);
     if (address) {
       // Hands the C++ object to the host; the instance lives on as long as it.
       PyObject *disowned = PyObject_CallMethod(instance, "__disown__", nullptr);
@@ -98,9 +137,10 @@ void *create(PyObject *creator, const char *base) {
       else
         address = nullptr;
     }
+    if (address) scriptrunner::rememberInstance(address, instance);
     Py_DECREF(instance);
   }
-  if (!address) TpythonInterpreter::interpreter().catchAndReportException();
+  if (!address) scriptrunner::reportException(creatorName(creator));
   return address;
 }
 
@@ -125,23 +165,39 @@ void release(PyObject *object) {
 void *hold() { return new TpythonLock; }
 void unhold(void *held) { delete static_cast<TpythonLock *>(held); }
 
+// The C++ object of a value the script made: an instance of the sibling
+// module's class `cls`, whose "this" converts to the address. Null with
+// TypeError set when it is not one.
+const void *valueAddress(PyObject *made, const char *cls) {
+  PyObject *name = PyUnicode_FromString("openvorla.OpenVorla");
+  PyObject *module = name ? PyImport_GetModule(name) : nullptr;
+  Py_XDECREF(name);
+  PyObject *type = module ? PyObject_GetAttrString(module, cls) : nullptr;
+  Py_XDECREF(module);
+  PyErr_Clear();
+  PyObject *self = type && PyObject_IsInstance(made, type) == 1
+                       ? PyObject_GetAttrString(made, "this")
+                       : nullptr;
+  Py_XDECREF(type);
+  PyObject *number = self ? PyNumber_Long(self) : nullptr;
+  Py_XDECREF(self);
+  const void *address = number ? PyLong_AsVoidPtr(number) : nullptr;
+  Py_XDECREF(number);
+  PyErr_Clear();
+  if (!address)
+    PyErr_Format(PyExc_TypeError, "a %s creator must return a %s, not %s", cls, cls,
+                 typeName(made).c_str());
+  return address;
+}
+
 int value(PyObject *callable, const char *cls, void (*read)(const void *, void *),
           void *context) {
   TpythonLock lock;
   if (callable == Py_None) return 0;
   PendingError pending;
   PyObject *made = PyObject_CallNoArgs(callable);
-  PyObject *type = made ? packageClass("openvorla.OpenVorla", cls) : nullptr;
-  void *address = nullptr;
-  if (made && (!type || PyObject_IsInstance(made, type) != 1)) {
-    if (!PyErr_Occurred())
-      PyErr_Format(PyExc_TypeError, "a %s creator must return a %s, not '%.200s'", cls, cls,
-                   Py_TYPE(made)->tp_name);
-  } else if (made) {
-    address = addressOf(made, true);
-  }
+  const void *address = made ? valueAddress(made, cls) : nullptr;
   if (address) read(address, context);
-  Py_XDECREF(type);
   Py_XDECREF(made);
   if (address) return 1;
   TpythonInterpreter::interpreter().catchAndReportException();
@@ -157,3 +213,48 @@ struct Installation {
 } gInstallation;
 
 }  // namespace
+
+namespace scriptrunner {
+namespace {
+
+// Weak references by address, under the interpreter lock. Entries of dead
+// instances go when the table has doubled since it was last swept.
+struct Instances {
+  std::unordered_map<const void *, PyObject *> byAddress;
+  size_t swept = 0;
+};
+
+Instances &instances() {
+  static Instances *table = new Instances;  // outlives the interpreter's last use
+  return *table;
+}
+
+}  // namespace
+
+void rememberInstance(const void *address, PyObject *instance) {
+  Instances &table = instances();
+  PyObject *ref = PyWeakref_NewRef(instance, nullptr);
+  if (!ref) PyErr_Clear();  // a class without weak references goes unnamed
+  PyObject *&slot = table.byAddress[address];
+  Py_XSETREF(slot, ref);
+  if (table.byAddress.size() < 2 * table.swept + 64) return;
+  for (auto it = table.byAddress.begin(); it != table.byAddress.end();) {
+    if (!it->second || PyWeakref_GET_OBJECT(it->second) == Py_None) {
+      Py_XDECREF(it->second);
+      it = table.byAddress.erase(it);
+    } else {
+      ++it;
+    }
+  }
+  table.swept = table.byAddress.size();
+}
+
+PyObject *instanceAt(const void *address) {
+  Instances &table = instances();
+  auto it = table.byAddress.find(address);
+  if (it == table.byAddress.end() || !it->second) return nullptr;
+  PyObject *object = PyWeakref_GET_OBJECT(it->second);
+  return object == Py_None ? nullptr : Py_NewRef(object);
+}
+
+}  // namespace scriptrunner

@@ -73,6 +73,7 @@ class TestCommandLine:
         assert done.returncode == 0 and done.stderr == ''
         assert done.stdout.startswith(
             'usage: vorla [--plugin FILE]... [--threads N] [SCRIPT [ARGS...]]\n'
+            '       vorla --check PLUGIN...\n'
             '       vorla --help\n')
 
     def test_usage_errors_exit_with_status_2(self, vorla):
@@ -192,15 +193,16 @@ class TestFailingPlugins:
             ''')
         assert done.returncode == 0, done.stderr
         assert done.stdout.splitlines() == [
-            "initializePlugin of the plug-in 'failing' failed",
-            f"The plug-in file '{broken}' failed to import",
+            "initializePlugin of the plug-in 'failing' failed: ValueError: no licence for failing",
+            f"The plug-in file '{broken}' failed to import: SyntaxError: expected ':'",
             'init leaving',
             "['leaving'] [('Command', 'count', 'leaving')]",
             '[] []',
             'ValueError: no licence for failing',
             "SyntaxError: expected ':'",
             "KeyError: ('still busy', 'leaving')"]
-        assert ('Python exception in plug-in:\nTraceback (most recent call last):\n'
+        assert ("Python exception in plug-in 'failing', in initializePlugin, loading the plug-in:\n"
+                'Traceback (most recent call last):\n'
                 f'  File "{failing}", line 9, in initializePlugin\n') in done.stderr
         assert f'  File "{leaving}", line 15, in uninitializePlugin\n' in done.stderr
 
@@ -239,13 +241,14 @@ class TestFailingPlugins:
         assert done.returncode == 0, done.stderr
         assert done.stdout.splitlines() == [
             'fragile1',
-            "The creator of the node type 'fragile' made no node",
+            "The creator of the node type 'fragile' made no node: "
+            "LookupError: the second node is one too many",
             'LookupError: the second node is one too many',
             'fragile2',
-            "Computing 'fragile1.output' failed: Failure",
+            "Computing 'fragile1.output' failed: ArithmeticError: no square root of -4.0",
             'ArithmeticError: no square root of -4.0',
             '3.0',
-            "Computing 'fragile1.output' failed: Failure",
+            "Computing 'fragile1.output' failed: ArithmeticError: no square root of -4.0",
             'ArithmeticError: no square root of -4.0',
             '4.0',
             "2.0 [('fragile1', 'fragile', 3), ('fragile2', 'fragile', 2)]"]

@@ -108,7 +108,7 @@ def test_the_host_checks_and_converts_arguments_against_the_syntax(vorla):
         "['-zzz', '2']",
         "The syntax creator of the command 'broken' failed | ZeroDivisionError: division by zero",
         "The syntax creator of the command 'wrong' failed | "
-        "TypeError: a VSyntax creator must return a VSyntax, not 'str'",
+        "TypeError: a VSyntax creator must return a VSyntax, not a str",
         "run_command() takes numbers and strings as the command's arguments, not 'list'",
         '0']
 

@@ -90,8 +90,10 @@ def test_offset_command_with_its_arguments_undo_and_redo(vorla):
             print(e)
         ''')
     assert lines == ['1.5', '2.5', '2', '1.5', '1.0', '1.5',
-                     "The command 'offsetAttr' failed: Failure",
-                     "The command 'offsetAttr' failed: Failure",
+                     "The command 'offsetAttr' failed: "
+                     "RuntimeError: The node 's' has no attribute 'nothing'",
+                     "The command 'offsetAttr' failed: "
+                     "RuntimeError: The plug 's.output' is not writable",
                      "RuntimeError: The plug 's.output' is not writable",
                      '0', 'There is nothing to undo']
 
@@ -108,7 +110,8 @@ def test_vector_data_reads_copies_and_writes_itself(vorla):
         print(vorla.alive('VPxData') - before[1][2])
         ''')
     assert lines == ["('1 2.5 -3', '1 2.5 -3')", "('0.1 1e-300 7', '0.1 1e-300 7')",
-                     "Reading the data type 'vectorData' from ASCII failed: Failure",
+                     "Reading the data type 'vectorData' from ASCII failed: "
+                     "ValueError: vectorData needs three numbers, got 2",
                      'ValueError: vectorData needs three numbers, got 2', '0']
 
 

@@ -65,6 +65,7 @@
 #include <standin/Lifetime.h>
 #include <standin/Nodes.h>
 #include <standin/Objects.h>
+#include <standin/Operation.h>
 #include <standin/Plugins.h>
 #include <standin/Registry.h>
 
@@ -317,11 +318,25 @@ void testExceptionReport() {
     auto log = Tlog::entries();
     CHECK(log.size() == 1);
     const std::string entry = log.empty() ? std::string() : log.front();
-    CHECK(entry.rfind("Python exception in plug-in:\nTraceback (most recent call last):\n", 0) ==
-          0);
+    // Outside any operation of the host, only the code is known.
+    CHECK(entry.rfind("Python exception in plug-in, in explode:\n"
+                      "Traceback (most recent call last):\n",
+                      0) == 0);
     CHECK(contains(entry, ", line 2, in explode\n"));
     CHECK(contains(entry, "\nZeroDivisionError: division by zero") && entry.back() != '\n');
     CHECK(!interpreter.catchAndReportException() && Tlog::entries().size() == 1);
+
+    // Inside one: the plug-in and what the host did, and the exception's
+    // summary left for the host's failure text.
+    standin::Doing computing(nullptr, "compute", [] {
+      return standin::Operation::Description{"shapes", "computing 'ring1.area'"};
+    });
+    PyErr_SetString(PyExc_KeyError, "radius");
+    CHECK(interpreter.catchAndReportException());
+    CHECK(Tlog::entries().back() ==
+          "Python exception in plug-in 'shapes', in compute, computing 'ring1.area':\n"
+          "KeyError: 'radius'");
+    CHECK(computing.failure() == "KeyError: 'radius'");
     Py_DECREF(globals);
   });
 }

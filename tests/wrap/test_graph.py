@@ -208,9 +208,11 @@ class TestEvaluation:
             host.graph_set(node + '.input', x)
         with pytest.raises(RuntimeError) as e:
             host.graph_evaluate(8)
-        assert str(e.value) == "Computing 'c3_0.output' failed: Failure"
+        assert str(e.value) == "Computing 'c3_0.output' failed: ValueError: unlucky input"
         log = host.log_entries()
-        assert len(log) == 1 and log[0].startswith('Python exception in plug-in:\nTraceback')
+        assert len(log) == 1 and log[0].startswith(
+            "Python exception in plug-in 'graphPlugin', in SineNode.compute, "
+            "computing 'c3_0.output':\nTraceback")
         assert ', in compute\n' in log[0] and log[0].endswith('ValueError: unlucky input')
         counts = computes()
         # Past the two computes of build(): the failed one, and none below it.
@@ -220,7 +222,7 @@ class TestEvaluation:
         # The failed chain stays dirty: reading it computes again, and fails again.
         with pytest.raises(RuntimeError) as e:
             host.graph_get('c3_3.output')
-        assert str(e.value) == "Computing 'c3_0.output' failed: Failure"
+        assert str(e.value) == "Computing 'c3_0.output' failed: ValueError: unlucky input"
         host.graph_set('c3_0.input', 3.0)
         host.graph_evaluate(8)
         assert host.graph_get('c3_3.output') == self.expected([3.0])[3][0]

@@ -22,6 +22,7 @@ struct RegisteredCallback {
   std::string role;  // "creator", "initializer", "syntax creator", ...
   bool script;       // a script object rather than a C++ function
   PyObject *object;  // the script object, held by the registry; null for a function
+  std::string makes;  // the plug-in class of the instances it makes ("VPxNode"), or empty
 };
 
 // One registration, as tests read it.
