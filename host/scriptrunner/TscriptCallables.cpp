@@ -70,10 +70,11 @@ std::string typeName(PyObject *object) {
 // The C++ address of the instance a creator returned, which must be of the
 // plug-in class `base` as the package that plug-ins import defines it, and
 // have its C++ object: its "this" converts to the address. Null with
-// TypeError set when it is not so.
+// TypeError set when it is not so. Without the package, or a `base`, only
+// the C++ object is looked for.
 void *addressOf(PyObject *instance, const char *base) {
   PyObject *module = proxyModule();
-  PyObject *cls = module ? PyObject_GetAttrString(module, base) : nullptr;
+  PyObject *cls = module && base ? PyObject_GetAttrString(module, base) : nullptr;
   int is = cls ? PyObject_IsInstance(instance, cls) : -1;
   Py_XDECREF(cls);
   PyErr_Clear();
