@@ -41,11 +41,13 @@ test-plain: build
 	cmake --build $(BUILD) --target test-support
 	$(BUILD)/bin/host_selftest
 	OPENVORLA_BUILD=$(BUILD) $(PYTHON) -m pytest -q tests
+	PYTHONPATH=$(BUILD)/python $(PYTHON) -m pytest -q examples/tests
 
 test-asan: build-asan
 	cmake --build $(ASAN_BUILD) --target test-support
 	ASAN_OPTIONS=detect_leaks=0:abort_on_error=1 $(ASAN_BUILD)/bin/host_selftest
 	$(SANITIZED) OPENVORLA_BUILD=$(ASAN_BUILD) $(PYTHON) -m pytest -q tests
+	$(SANITIZED) PYTHONPATH=$(ASAN_BUILD)/python $(PYTHON) -m pytest -q examples/tests
 	ASAN_OPTIONS=detect_leaks=0:abort_on_error=1 $(ASAN_BUILD)/bin/vorla \
 	  $(foreach p,$(EXAMPLES),--plugin examples/plugins/$(p).py) examples/scenes/demo.py >/dev/null
 

@@ -1,5 +1,8 @@
 // What the parts of the application `vorla` share: the plug-in loader, the
-// host scripting module and the way host work runs without Python.
+// host scripting module and the way host work runs without Python. They
+// live in a library of their own (libvorlaapp), which the program links and
+// which the extension module vorla._host loads into a plain Python process:
+// a script, and so a test, drives the same application in either.
 #pragma once
 
 #define PY_SSIZE_T_CLEAN
@@ -34,12 +37,18 @@ void unloadAllPlugins();
 // The loaded plug-ins' names, in load order.
 std::vector<std::string> loadedPlugins();
 
-// The host scripting module, registered with PyImport_AppendInittab.
+// Unloads every plug-in and deletes every node and every command kept for
+// undo: the application as it started. Needs the interpreter lock.
+void reset();
+
+// The host scripting module vorla._host, which the package vorla exports.
 PyObject *initScriptingModule();
 // The most host threads that may evaluate the graph.
 constexpr int kMaxThreads = 256;
-// What `vorla.evaluate()` uses without an argument: the --threads value.
+// What `vorla.evaluate()` uses without an argument: the --threads value,
+// one per core (at most kMaxThreads) until it is set.
 void setDefaultThreads(int threads);
+int defaultThreads();
 
 // Runs host work with the interpreter lock released, so that the host's
 // threads can call into Python meanwhile (each takes the lock through

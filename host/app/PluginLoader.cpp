@@ -265,4 +265,14 @@ std::vector<std::string> loadedPlugins() {
   return names;
 }
 
+void reset() {
+  unloadAllPlugins();
+  withoutInterpreterLock([] {
+    standin::Commands::instance().flush();
+    standin::Graph::instance().clear();
+    standin::unloadAllPlugins();
+    return 0;
+  });
+}
+
 }  // namespace vorla

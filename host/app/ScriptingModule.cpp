@@ -16,6 +16,9 @@
 #include <standin/Lifetime.h>
 #include <standin/Registry.h>
 
+#include <algorithm>
+#include <thread>
+
 using OPENVORLA_NAMESPACE::VStatus;
 using standin::Commands;
 using standin::Files;
@@ -24,7 +27,12 @@ using standin::Graph;
 namespace vorla {
 namespace {
 
-int gDefaultThreads = 1;
+int coresToUse() {
+  unsigned cores = std::thread::hardware_concurrency();
+  return cores ? static_cast<int>(std::min<unsigned>(cores, kMaxThreads)) : 1;
+}
+
+int gDefaultThreads = coresToUse();
 
 // Null with RuntimeError set for a failing status, otherwise None.
 PyObject *statusResult(const VStatus &status) {
@@ -411,6 +419,18 @@ PyObject *round_trip_data(PyObject *, PyObject *args) {
 
 PyObject *log(PyObject *, PyObject *) { return listOf(Tlog::entries(), str); }
 
+PyObject *write_log(PyObject *, PyObject *args) {
+  const char *entry;
+  if (!PyArg_ParseTuple(args, "s:write_log", &entry)) return nullptr;
+  Tlog::write(entry);
+  Py_RETURN_NONE;
+}
+
+PyObject *reset(PyObject *, PyObject *) {
+  vorla::reset();
+  Py_RETURN_NONE;
+}
+
 PyObject *alive(PyObject *, PyObject *args) {
   const char *cls;
   if (!PyArg_ParseTuple(args, "s:alive", &cls)) return nullptr;
@@ -470,11 +490,17 @@ PyMethodDef kFunctions[] = {
      "round_trip_data(type_name, text) -> (written, copied)\n\nMakes the data type, reads "
      "it from the text, copies it and writes\nboth back."},
     {"log", log, METH_NOARGS, "log() -> [entry, ...] of the application's log"},
+    {"write_log", write_log, METH_VARARGS,
+     "write_log(entry)\n\nWrites the entry to the application's log (stderr), where log() "
+     "keeps it."},
+    {"reset", reset, METH_NOARGS,
+     "reset()\n\nUnloads every plug-in and deletes every node and every command kept\nfor "
+     "undo: the application as it started."},
     {"alive", alive, METH_VARARGS, "alive(class_name) -> number of live host objects of the class"},
     {nullptr, nullptr, 0, nullptr}};
 
 PyModuleDef kModule = {PyModuleDef_HEAD_INIT,
-                       "vorla",
+                       "vorla._host",
                        "The application's scripting interface: plug-ins, nodes, commands, files.",
                        -1,
                        kFunctions,
@@ -486,6 +512,7 @@ PyModuleDef kModule = {PyModuleDef_HEAD_INIT,
 }  // namespace
 
 void setDefaultThreads(int threads) { gDefaultThreads = threads; }
+int defaultThreads() { return gDefaultThreads; }
 
 PyObject *initScriptingModule() { return PyModule_Create(&kModule); }
 

@@ -1,27 +1,26 @@
 // vorla: the application. It embeds Python 3.11, loads plug-ins written with
-// the openvorla package, runs a host script, and unloads the plug-ins.
+// the openvorla package, runs a host script (or the interactive prompt), and
+// unloads the plug-ins.
 //
 // The interpreter lock: the main thread holds it only while it runs Python
 // (loading a plug-in, running the script) and takes it through TpythonLock
 // like every other host thread; the rest of the time the host works without
 // it, so that its threads can call into plug-ins.
 #include "Application.h"
+#include "Session.h"
 
 #include <scriptrunner/TpythonLock.h>
-#include <standin/Graph.h>
-#include <standin/Plugins.h>
 
-#include <algorithm>
+#include <unistd.h>
+
 #include <cstdio>
 #include <cstdlib>
-#include <cstring>
 #include <filesystem>
-#include <thread>
 
 namespace {
 
 const char kSynopsis[] =
-    "usage: vorla [--plugin FILE]... [--threads N] [SCRIPT [ARGS...]]\n"
+    "usage: vorla [--plugin FILE]... [--threads N] [-i] [SCRIPT [ARGS...]]\n"
     "       vorla --check PLUGIN...\n"
     "       vorla --help\n";
 const char kDescription[] =
@@ -30,10 +29,14 @@ const char kDescription[] =
     "uninitializePlugin), runs the host SCRIPT with sys.argv = [SCRIPT, ARGS...],\n"
     "then unloads the plug-ins. The script drives the application through the\n"
     "module 'vorla' (see help(vorla)). Each plug-in is checked as it loads, and\n"
-    "what the checks find is logged as warnings.\n"
+    "what the checks find is logged as warnings. Without a SCRIPT, vorla reads\n"
+    "the script from stdin, or opens Python's interactive prompt, with vorla\n"
+    "imported, when stdin is a terminal. The logging module writes to the\n"
+    "application's log (stderr); output is written line by line.\n"
     "\n"
     "  --plugin FILE  load a plug-in before the script; may be repeated\n"
     "  --threads N    host threads that evaluate the graph (default: one per core)\n"
+    "  -i             open the interactive prompt after the script\n"
     "  --check        load each PLUGIN alone, check it, unload it, and print what\n"
     "                 the checks find as 'file:line: message': methods whose names\n"
     "                 are near misses of an operation, operations that cannot take\n"
@@ -53,18 +56,20 @@ struct Options {
   std::vector<std::string> script;  // the script's path and its arguments
   bool help = false;
   bool check = false;  // the plug-ins are to be checked, and nothing run
+  bool interactive = false;
 };
 
 // False with a message for a usage error.
 bool parseCommandLine(int argc, char **argv, Options &options, std::string &error) {
-  unsigned cores = std::thread::hardware_concurrency();
-  options.threads = cores ? static_cast<int>(std::min<unsigned>(cores, vorla::kMaxThreads)) : 1;
+  options.threads = vorla::defaultThreads();
   for (int i = 1; i < argc; ++i) {
     std::string arg = argv[i];
     if (arg == "--help" || arg == "-h") {
       options.help = true;
     } else if (arg == "--check") {
       options.check = true;
+    } else if (arg == "-i") {
+      options.interactive = true;
     } else if (arg == "--plugin" || arg == "--threads") {
       if (i + 1 == argc) {
         error = arg + " needs a value";
@@ -123,7 +128,6 @@ bool startPython(const Options &options) {
   preconfig.utf8_mode = 1;
   if (failed(Py_PreInitialize(&preconfig))) return false;
 
-  if (PyImport_AppendInittab("vorla", &vorla::initScriptingModule) < 0) return false;
   PyConfig config;
   PyConfig_InitIsolatedConfig(&config);
   config.install_signal_handlers = 1;  // Ctrl-C interrupts a script
@@ -139,9 +143,10 @@ bool startPython(const Options &options) {
   return !failed(status);
 }
 
-// Puts the package (and, as python does, the script's directory) first on
-// sys.path and imports the module early, so that a broken installation is
-// found before any plug-in runs.
+// Puts the packages (and, as python does, the script's directory) first on
+// sys.path and imports them early, so that a broken installation is found
+// before any plug-in runs; sets up output and logging as the program has
+// them.
 bool preparePackage(const Options &options) {
   std::filesystem::path package = packageDirectory();
   PyObject *path = PySys_GetObject("path");  // borrowed
@@ -155,90 +160,18 @@ bool preparePackage(const Options &options) {
     Py_XDECREF(dir);
   }
   PyObject *module = ok ? PyImport_ImportModule("openvorla.OpenVorlaVPx") : nullptr;
-  if (!module) {
+  Py_XDECREF(module);
+  PyObject *application = module ? PyImport_ImportModule("vorla") : nullptr;
+  PyObject *started =
+      application ? PyObject_CallMethod(application, "_start_program", nullptr) : nullptr;
+  Py_XDECREF(application);
+  if (!started) {
     PyErr_Print();
-    std::fprintf(stderr, "vorla: cannot import openvorla from %s\n", package.c_str());
+    std::fprintf(stderr, "vorla: cannot import openvorla and vorla from %s\n", package.c_str());
     return false;
   }
-  Py_DECREF(module);
+  Py_DECREF(started);
   return true;
-}
-
-// Loads each plug-in alone, prints what the checks find, and unloads it. 1
-// when a plug-in failed to load or the checks found anything.
-int checkPlugins(const std::vector<std::string> &files) {
-  int status = 0;
-  for (const std::string &file : files) {
-    TpythonLock lock;
-    std::string name;
-    std::vector<std::string> findings;
-    std::string failure = vorla::loadPlugin(file, &name, &findings);
-    if (!failure.empty()) {
-      std::fprintf(stderr, "vorla: %s\n", failure.c_str());
-      status = 1;
-      continue;
-    }
-    for (const std::string &finding : findings) std::printf("%s\n", finding.c_str());
-    std::fflush(stdout);
-    if (!findings.empty()) status = 1;
-    vorla::unloadPlugin(name);
-  }
-  return status;
-}
-
-// The exit status SystemExit asks for, printing a message it carries.
-int exitStatus(PyObject *systemExit) {
-  PyObject *code = PyObject_GetAttrString(systemExit, "code");
-  int status = 1;
-  if (!code || code == Py_None) {
-    status = code ? 0 : 1;
-  } else if (PyLong_Check(code)) {
-    status = static_cast<int>(PyLong_AsLong(code));
-  } else if (PyObject *text = PyObject_Str(code)) {
-    std::fprintf(stderr, "%s\n", PyUnicode_AsUTF8(text));
-    Py_DECREF(text);
-  }
-  Py_XDECREF(code);
-  PyErr_Clear();
-  return status;
-}
-
-// Runs the script as __main__. Its own exception is printed with its
-// traceback as python prints it, and the status is 1.
-int runScript(const std::string &file) {
-  FILE *fp = std::fopen(file.c_str(), "rb");
-  if (!fp) {
-    std::fprintf(stderr, "vorla: cannot open script '%s': %s\n", file.c_str(),
-                 std::strerror(errno));
-    return 2;
-  }
-  PyObject *globals = PyModule_GetDict(PyImport_AddModule("__main__"));  // borrowed
-  PyObject *name = PyUnicode_FromString(file.c_str());
-  if (!name || PyDict_SetItemString(globals, "__file__", name) < 0) {
-    Py_XDECREF(name);
-    std::fclose(fp);
-    PyErr_Print();
-    return 1;
-  }
-  Py_DECREF(name);
-  PyObject *result =
-      PyRun_FileExFlags(fp, file.c_str(), Py_file_input, globals, globals, 1, nullptr);
-  if (result) {
-    Py_DECREF(result);
-    return 0;
-  }
-  if (PyErr_ExceptionMatches(PyExc_SystemExit)) {
-    PyObject *type, *value, *traceback;
-    PyErr_Fetch(&type, &value, &traceback);
-    PyErr_NormalizeException(&type, &value, &traceback);
-    int status = exitStatus(value);
-    Py_XDECREF(type);
-    Py_XDECREF(value);
-    Py_XDECREF(traceback);
-    return status;
-  }
-  PyErr_Print();
-  return 1;
 }
 
 }  // namespace
@@ -254,6 +187,7 @@ int main(int argc, char **argv) {
     std::printf("%s%s", kSynopsis, kDescription);
     return 0;
   }
+  std::setvbuf(stdout, nullptr, _IOLBF, 0);  // the host's output, line by line too
   if (!startPython(options)) return 1;
   if (!preparePackage(options)) {
     Py_FinalizeEx();
@@ -263,7 +197,7 @@ int main(int argc, char **argv) {
   PyThreadState *mainThread = PyEval_SaveThread();
 
   int status = 0;
-  if (options.check) status = checkPlugins(options.plugins);
+  if (options.check) status = vorla::checkPlugins(options.plugins);
   // A plug-in the command line names must load: without it the script would
   // run in an application that lacks what it expects.
   for (const std::string &file : options.check ? std::vector<std::string>() : options.plugins) {
@@ -276,19 +210,19 @@ int main(int argc, char **argv) {
       break;
     }
   }
-  if (status == 0 && !options.script.empty()) {
+  if (status == 0 && !options.check) {
     TpythonLock lock;
-    status = runScript(options.script[0]);
+    if (!options.script.empty()) status = vorla::runScript(options.script[0]);
+    // As python: the prompt after the script with -i, or on a terminal
+    // without one; otherwise the script stdin holds.
+    if (options.interactive || (options.script.empty() && isatty(STDIN_FILENO)))
+      status = vorla::interact();
+    else if (options.script.empty())
+      status = vorla::runStdin();
   }
   {
     TpythonLock lock;
-    vorla::unloadAllPlugins();
-    vorla::withoutInterpreterLock([] {
-      standin::Commands::instance().flush();
-      standin::Graph::instance().clear();
-      standin::unloadAllPlugins();
-      return 0;
-    });
+    vorla::reset();
   }
 
   PyEval_RestoreThread(mainThread);

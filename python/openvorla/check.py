@@ -319,5 +319,5 @@ def check(module, callbacks, shown=None):
 
 def check_plugin(module, plugin, shown=None):
     """check() on a plug-in that vorla loaded, with what it registered."""
-    import vorla  # type: ignore[import]  # the application's own module
+    import vorla
     return check(module, vorla.callbacks(plugin), shown)

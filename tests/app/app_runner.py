@@ -25,12 +25,15 @@ class Vorla:
         path.write_text(textwrap.dedent(text))
         return str(path)
 
-    def run(self, *args, script=None, env=None, timeout=120):
-        """vorla with the arguments, and a script given as text last."""
+    def run(self, *args, script=None, env=None, timeout=120, stdin='', merged=False):
+        """vorla with the arguments, and a script given as text last; stdin
+        holds `stdin`. merged: stderr goes where stdout does."""
         command = [VORLA, *args]
         if script is not None:
             command.append(self.file('script.py', script))
-        return subprocess.run(command, capture_output=True, text=True, timeout=timeout,
+        return subprocess.run(command, stdout=subprocess.PIPE,
+                              stderr=subprocess.STDOUT if merged else subprocess.PIPE,
+                              input=textwrap.dedent(stdin), text=True, timeout=timeout,
                               env=env, cwd=self.tmp_path)
 
     def ok(self, *args, **kwargs):

@@ -72,7 +72,7 @@ class TestCommandLine:
         done = vorla.run('--help')
         assert done.returncode == 0 and done.stderr == ''
         assert done.stdout.startswith(
-            'usage: vorla [--plugin FILE]... [--threads N] [SCRIPT [ARGS...]]\n'
+            'usage: vorla [--plugin FILE]... [--threads N] [-i] [SCRIPT [ARGS...]]\n'
             '       vorla --check PLUGIN...\n'
             '       vorla --help\n')
 
@@ -117,6 +117,34 @@ class TestCommandLine:
         assert (done.returncode, done.stderr) == (1, 'giving up\n')
         done = vorla.run('missing.py')
         assert done.returncode == 2 and done.stderr.startswith("vorla: cannot open script")
+
+    def test_without_a_script_stdin_is_the_script_and_i_opens_the_prompt(self, vorla):
+        counter = vorla.file('counter.py', COUNTER)
+        # vorla is imported for it, as at the prompt.
+        done = vorla.run('--plugin', counter, stdin='print(vorla.plugins())\nexit(4)\n')
+        assert (done.returncode, done.stdout) == (4, "init counter\n['counter']\nuninit counter\n")
+        # -i after the script: the script's names are there; exit() ends the prompt, and the
+        # plug-ins are unloaded all the same.
+        done = vorla.run('-i', '--plugin', counter, script='x = 6', merged=True,
+                         stdin='print(x * 7, vorla.plugins())\n1 / 0\nexit(5)\n')
+        lines = done.stdout.splitlines()
+        assert done.returncode == 5
+        assert lines[0] == 'init counter' and lines[-1] == '>>> uninit counter'
+        assert lines[1].startswith('vorla, Python 3.11.') and lines[1].endswith('; plug-ins: counter')
+        assert lines[2:4] == [">>> 42 ['counter']", '>>> Traceback (most recent call last):']
+        assert lines[-2] == 'ZeroDivisionError: division by zero'
+
+    def test_output_comes_in_the_order_written_and_logging_goes_to_the_log(self, vorla):
+        done = vorla.run('--plugin', vorla.file('counter.py', COUNTER), script="""
+            import logging, vorla
+            print('first')
+            logging.getLogger('scene').info('second %d', 2)
+            print('third')
+            vorla.run_command('nothing')
+            """, merged=True)
+        assert done.stdout.splitlines()[:5] == [
+            'init counter', 'first', 'Info: scene: second 2', 'third',
+            'Traceback (most recent call last):']
 
 
 class TestPlugins:
