@@ -59,30 +59,31 @@ DoubleBuffer::DoubleBuffer(PyObject *obj, int rank) {
   }
 }
 
-bool ItemIndex(PyObject *key, Py_ssize_t length, const char *cls, const char *what,
-               Py_ssize_t *index) {
-  Py_ssize_t i = -1;
-  if (PyIndex_Check(key)) {
-    i = PyNumber_AsSsize_t(key, PyExc_IndexError);
-    if (i == -1 && PyErr_Occurred()) {
-      // An index too large for any sequence is out of range, as for a list;
-      // an __index__ that fails leaves the key no index at all.
-      if (!PyErr_ExceptionMatches(PyExc_IndexError)) {
-        PyErr_Clear();
-        PyErr_Format(PyExc_TypeError, "%s indices must be %s, not %.200s", cls, what,
-                     Py_TYPE(key)->tp_name);
-        return false;
-      }
-      PyErr_Clear();
-      PyErr_Format(PyExc_IndexError, "%s index out of range", cls);
-      return false;
-    }
-  } else {
+bool IndexOf(PyObject *key, const char *cls, const char *what, Py_ssize_t *index) {
+  if (!PyIndex_Check(key)) {
     PyErr_Format(PyExc_TypeError, "%s indices must be %s, not %.200s", cls, what,
                  Py_TYPE(key)->tp_name);
     return false;
   }
-  if (i < 0) i += length;
+  Py_ssize_t i = PyNumber_AsSsize_t(key, PyExc_IndexError);
+  if (i == -1 && PyErr_Occurred()) {
+    // An index too large for any sequence is out of range, as for a list;
+    // an __index__ that fails leaves the key no index at all.
+    const bool large = PyErr_ExceptionMatches(PyExc_IndexError);
+    PyErr_Clear();
+    if (large)
+      PyErr_Format(PyExc_IndexError, "%s index out of range", cls);
+    else
+      PyErr_Format(PyExc_TypeError, "%s indices must be %s, not %.200s", cls, what,
+                   Py_TYPE(key)->tp_name);
+    return false;
+  }
+  *index = i;
+  return true;
+}
+
+bool InRange(Py_ssize_t *index, Py_ssize_t length, const char *cls) {
+  Py_ssize_t i = *index < 0 ? *index + length : *index;
   if (i < 0 || i >= length) {
     PyErr_Format(PyExc_IndexError, "%s index out of range", cls);
     return false;

@@ -214,11 +214,20 @@ const T *ElementOf(PyObject *item, swig_type_info *ty, T &) {
 
 // --- subscripts ---------------------------------------------------------------
 
-// The position `key` names in a sequence of `length` items, counting a
-// negative one from the end. False with TypeError ("<cls> indices must be
-// <what>, not <type>") or IndexError ("<cls> index out of range") set.
-bool ItemIndex(PyObject *key, Py_ssize_t length, const char *cls, const char *what,
-               Py_ssize_t *index);
+// The integer `key` is, counting a negative one from the end later: false
+// with TypeError ("<cls> indices must be <what>, not <type>") set, or
+// IndexError for one too large for any sequence.
+bool IndexOf(PyObject *key, const char *cls, const char *what, Py_ssize_t *index);
+
+// `*index` within `length` items, a negative one counted from the end; false
+// with IndexError ("<cls> index out of range") set.
+bool InRange(Py_ssize_t *index, Py_ssize_t length, const char *cls);
+
+// Both: the position `key` names in a sequence of `length` items.
+inline bool ItemIndex(PyObject *key, Py_ssize_t length, const char *cls, const char *what,
+                      Py_ssize_t *index) {
+  return IndexOf(key, cls, what, index) && InRange(index, length, cls);
+}
 
 // The positions a tuple of `rank` integers names in a grid of `dims`.
 bool GridIndex(PyObject *key, const Py_ssize_t *dims, int rank, const char *cls,

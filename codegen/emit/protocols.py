@@ -118,21 +118,22 @@ def _getitem(cls: str, ep: EntryPoint, shape: Shape) -> str:
 
 def _setitem(cls: str, ep: EntryPoint, shape: Shape) -> str:
     what = _indices(shape)[1]
-    # The value first: reading it may run Python code, which could change the
-    # length the index is checked against.
-    out = _self(cls, ep, 3) + _e._convert(shape.value)
+    out = _self(cls, ep, 3)
     value = _e._value(shape.value)
     if shape.kind == 'grid':
         rank = len(shape.dims)
         out += (f'  static const Py_ssize_t dims[] = {_dims(shape.dims)};\n'
                 f'  Py_ssize_t at[{rank}];\n'
                 f'  if (!swigrt::GridIndex(argv[1], dims, {rank}, {c_string(cls)}, '
-                f'{c_string(what)}, at)) return nullptr;\n'
+                f'{c_string(what)}, at)) return nullptr;\n' + _e._convert(shape.value) +
                 f'  self({_at(shape, "at[0]")}, {_at(shape, "at[1]")}) = {value};\n')
     else:
+        # The index is checked against the length only once the value is read:
+        # reading it may run Python code that changes the length.
         out += ('  Py_ssize_t i = 0;\n'
-                f'  if (!swigrt::ItemIndex(argv[1], {_length(shape)}, {c_string(cls)}, '
-                f'{c_string(what)}, &i)) return nullptr;\n')
+                f'  if (!swigrt::IndexOf(argv[1], {c_string(cls)}, {c_string(what)}, &i)) '
+                'return nullptr;\n' + _e._convert(shape.value) +
+                f'  if (!swigrt::InRange(&i, {_length(shape)}, {c_string(cls)})) return nullptr;\n')
         if shape.assign == 'index':
             out += f'  self[{_at(shape, "i")}] = {value};\n'
         elif shape.checked[1]:
