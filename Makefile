@@ -50,7 +50,7 @@ test-asan: build-asan
 	  $(foreach p,$(EXAMPLES),--plugin examples/plugins/$(p).py) examples/scenes/demo.py >/dev/null
 
 EXAMPLES := sine_node offset_command vector_data text_translator wave_deformer \
-            marker_locator snap_transform scatter_command
+            marker_locator snap_transform scatter_command point_cloud
 
 demo: build
 	$(BUILD)/bin/vorla $(foreach p,$(EXAMPLES),--plugin examples/plugins/$(p).py) \
