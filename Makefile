@@ -63,6 +63,7 @@ bench: build
 	cmake --build $(BUILD) --target bench-modules
 	$(PYTHON) bench/bench_calls.py --build $(BUILD)
 	$(PYTHON) bench/bench_app.py --build $(BUILD)
+	$(PYTHON) bench/bench_values.py --build $(BUILD)
 
 clean:
 	rm -rf $(BUILD) $(ASAN_BUILD)

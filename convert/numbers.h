@@ -5,7 +5,8 @@
 // flag to set. A number is what Python's number protocols make one of, as
 // `math.sin` takes it: int and float, and anything with __index__ (numpy's
 // integers) or __float__ (numpy's other floats, Decimal). A sequence is not a
-// number, even one that would make one of itself (a numpy array of one).
+// number, even one that would make one of itself (a numpy array of one), and
+// neither is a complex number.
 //
 // The routines have the contract of those in scalars.h: a borrowed object, an
 // output that may be null, a result code, no Python error left pending.
@@ -57,10 +58,15 @@ inline int AsNumberUnsignedChar(PyObject *obj, unsigned char *out) {
 }
 
 inline int AsNumberDouble(PyObject *obj, double *out) {
+  if (PyFloat_CheckExact(obj)) {
+    if (out) *out = PyFloat_AS_DOUBLE(obj);
+    return SWIG_OK;
+  }
   if (PyFloat_Check(obj) || PyLong_Check(obj)) return AsDouble(obj, out);
   if (PyIndex_Check(obj)) return AsIndexed(obj, out, AsDouble);
   PyNumberMethods *nb = Py_TYPE(obj)->tp_as_number;
-  if (!nb || !nb->nb_float || PySequence_Check(obj)) return SWIG_TypeError;
+  if (!nb || !nb->nb_float || PySequence_Check(obj) || PyComplex_Check(obj))
+    return SWIG_TypeError;
   double v = PyFloat_AsDouble(obj);
   if (v == -1.0 && PyErr_Occurred()) {
     PyErr_Clear();

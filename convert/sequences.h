@@ -13,6 +13,7 @@
 #include <type_traits>
 #include <vector>
 
+#include "args.h"
 #include "errors.h"
 #include "numbers.h"
 #include "swigrt.h"
@@ -173,7 +174,10 @@ bool GridCheck(PyObject *obj, swig_type_info *ty, std::initializer_list<Py_ssize
 template <class T>
 bool ValueArg(PyObject *obj, swig_type_info *ty, void **out, T &local,
               int (*read)(PyObject *, T *), const char *message, const char *null_message) {
-  int res = ConvertPtr(obj, out, ty, 0);
+  // A list or tuple is no wrapped object: it is read without looking for one.
+  const bool listed = PyList_Check(obj) || PyTuple_Check(obj);
+  if (!listed && DirectPointer(obj, ty, out)) return true;
+  int res = listed ? SWIG_TypeError : ConvertPtr(obj, out, ty, 0);
   if (SWIG_IsOK(res) && *out) return true;
   if (SWIG_IsOK(res)) {
     SetErrorMessage(ErrorTypeFor(SWIG_ValueError), null_message);
@@ -190,8 +194,18 @@ bool ValueArg(PyObject *obj, swig_type_info *ty, void **out, T &local,
 
 template <class T>
 bool ValueCheck(PyObject *obj, swig_type_info *ty, int (*read)(PyObject *, T *)) {
+  if (PyList_Check(obj) || PyTuple_Check(obj)) return SWIG_IsOK(read(obj, nullptr));
   return SWIG_IsOK(ConvertPtr(obj, nullptr, ty, SWIG_POINTER_NO_NULL)) ||
          (obj != Py_None && SWIG_IsOK(read(obj, nullptr)));
+}
+
+// An operand of an operator: a wrapped object of the class, nothing else.
+inline bool OperandPointer(PyObject *obj, swig_type_info *ty, void **out) {
+  if (DirectPointer(obj, ty, out)) return true;
+  if (obj == Py_None || PyList_Check(obj) || PyTuple_Check(obj) || PyFloat_Check(obj) ||
+      PyLong_Check(obj) || PyUnicode_Check(obj))
+    return false;
+  return SWIG_IsOK(ConvertPtr(obj, out, ty, 0)) && *out;
 }
 
 // An item of a sequence read into an array: a wrapped object of the element

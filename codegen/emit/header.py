@@ -3,7 +3,7 @@ from __future__ import annotations
 
 from .common import banner, namespace_close, namespace_open
 from . import directors, protocols, variables
-from ..model import Module
+from ..model import METH_FASTCALL, Module
 
 
 def emit(module: Module) -> str:
@@ -26,7 +26,10 @@ def emit(module: Module) -> str:
     out += [f'#define {d.macro} swig_types[{d.index}]\n' for d in module.descriptors]
     out.append('\n')
     for e in module.entries:
-        if not e.function.startswith('swigrt::'):
+        if e.flags == METH_FASTCALL:
+            out.append(f'PyObject *{e.function}(PyObject *self, PyObject *const *args, '
+                       'Py_ssize_t nargs);\n')
+        elif not e.function.startswith('swigrt::'):
             out.append(f'PyObject *{e.function}(PyObject *self, PyObject *args);\n')
     shared = ''.join(protocols.declarations(c) for c in module.classes)
     if shared:

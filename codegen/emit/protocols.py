@@ -5,7 +5,7 @@ from __future__ import annotations
 
 from . import entries as _e
 from .common import c_string
-from ..model import Arg, Candidate, EntryPoint, WrappedClass
+from ..model import METH_O, Arg, Candidate, EntryPoint, WrappedClass
 from ..model.protocols import Element, Part, Shape, hash_function
 
 _NOT_IMPLEMENTED = ('  // Any other operand is for Python to try the other way round.\n'
@@ -47,20 +47,27 @@ def _dims(dims: tuple[int, ...]) -> str:
     return '{' + ', '.join(str(d) for d in dims) + '}'
 
 
+def _count(ep: EntryPoint, count: int) -> str:
+    """The arguments of a METH_FASTCALL entry point, counted."""
+    return (f'  if (!swigrt::CountArgs({c_string(ep.entry)}, {count}, {count}, nargs)) '
+            'return nullptr;\n  PyObject *const *argv = args;\n')
+
+
 def _self(cls: str, ep: EntryPoint, unpack: int) -> str:
-    """Unpacks the arguments and converts `self`, naming it `self`."""
+    """Counts the arguments and converts `self`, naming it `self`."""
     if unpack == 1:
         head = '  if (!arg) return nullptr;\n  PyObject *argv[1] = {arg};\n'
     else:
-        head = (f'  PyObject *argv[{unpack}] = {{}};\n'
-                f'  if (!swigrt::UnpackTuple(args, {c_string(ep.entry)}, {unpack}, {unpack}, '
-                'argv)) return nullptr;\n')
+        head = _count(ep, unpack)
     return head + _e._convert(ep.self_arg) + f'  {cls} &self = *static_cast<{cls} *>(argp1);\n'
 
 
 def _function(ep: EntryPoint, body: str) -> str:
-    param = 'arg' if ep.flags == 8 else 'args'
-    return _e._open(ep.function, param) + body + _e._CLOSE
+    if ep.flags == METH_O:
+        return _e._open(ep.function, 'arg') + body + _e._CLOSE
+    head = (f'PyObject *{ep.function}(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {{\n'
+            '  swigrt::CallScope scope;\n')
+    return head + body + _e._CLOSE
 
 
 # --- sequences -----------------------------------------------------------------------
@@ -152,9 +159,7 @@ def _iter(cls: str, ep: EntryPoint) -> str:
 
 def _call(cls: str, ep: EntryPoint, shape: Shape) -> str:
     c = ep.candidates[0]
-    out = (f'  PyObject *argv[{c.max_args}] = {{}};\n'
-           f'  if (!swigrt::UnpackTuple(args, {c_string(ep.entry)}, {c.min_args}, {c.max_args}, '
-           'argv)) return nullptr;\n' + ''.join(_e._convert(a) for a in c.args))
+    out = _count(ep, c.max_args) + ''.join(_e._convert(a) for a in c.args)
     indices = [a for a in c.args if not a.is_self]
     bounds = ', '.join(f'static_cast<unsigned long>(arg{a.number})' for a in indices)
     values = ', '.join(_e._value(a) for a in indices)
@@ -184,14 +189,26 @@ def _operator(cls: str, ep: EntryPoint) -> str:
         return _function(ep, '  if (!arg) return nullptr;\n  PyObject *argv[1] = {arg};\n' +
                          _e._convert(first.args[0]) + _e._result(first, _operation(cls, first)) +
                          '  return resultobj;\n')
-    out = ('  PyObject *argv[2] = {};\n'
-           f'  if (!swigrt::UnpackTuple(args, {c_string(ep.entry)}, 2, 2, argv)) return nullptr;\n'
-           + _e._convert(first.args[0]))
+    out = _count(ep, 2) + _e._convert(first.args[0])
     for c in ep.candidates:
-        out += (f'  if ({_e._check(c.args[1])}) {{\n'
-                + _indent(_e._convert(c.args[1]) + _e._result(c, _operation(cls, c)) +
-                          '  return resultobj;\n') + '  }\n')
+        out += '  {\n' + _indent(_operand(c.args[1]) + _indent(
+            _e._result(c, _operation(cls, c)) + '  return resultobj;\n') + '  }\n') + '  }\n'
     return _function(ep, out + _NOT_IMPLEMENTED)
+
+
+def _operand(a: Arg) -> str:
+    """Converts the other operand once, and opens the block that runs when
+    it converts."""
+    n = a.number
+    if a.kind == 'scalar':
+        return (f'  {a.cpp} arg{n}{{}};\n'
+                f'  if (SWIG_IsOK(swigrt::{a.converter}(argv[1], &arg{n}))) {{\n')
+    if a.kind == 'object':
+        return (f'  void *argp{n} = nullptr;\n'
+                f'  if (swigrt::OperandPointer(argv[1], {a.descriptor.macro}, &argp{n})) {{\n')
+    return (f'  VString arg{n};\n'
+            f'  if (swigrt::IsText(argv[1]) && swigrt::StrictStringArg(argv[1], arg{n}, '
+            f'{c_string(a.message)})) {{\n')
 
 
 # --- repr, hash, text -------------------------------------------------------------------

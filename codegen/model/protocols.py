@@ -36,7 +36,7 @@ from . import conversions
 from .naming import GeneratorError, spell, unqualified
 from .pytypes import BOOL, INT, NONE, OBJECT, STR, ClassRef, Generic, PySignature, PyParam, \
     PyType, SCALAR_TYPES, of
-from .records import (METH_O, METH_VARARGS, Arg, Candidate, Descriptor, EntryPoint, Result,
+from .records import (METH_FASTCALL, METH_O, Arg, Candidate, Descriptor, EntryPoint, Result,
                       WrappedClass)
 
 BINARY = {'operator+': 'add', 'operator-': 'sub', 'operator*': 'mul', 'operator/': 'truediv',
@@ -386,7 +386,7 @@ class Decider:
     # --- entry points ------------------------------------------------------------
 
     def special(self, cls: WrappedClass, member: str, protocol: str, sig: PySignature,
-                flags: int = METH_VARARGS) -> EntryPoint:
+                flags: int = METH_FASTCALL) -> EntryPoint:
         entry = f'{cls.name}_{member}'
         ep = EntryPoint(entry, f'wrap_{entry}', flags, [], member=member, protocol=protocol)
         ep.forms = [sig]
@@ -436,7 +436,7 @@ class Decider:
         entry = f'{cls.name}___call__'
         cand = self.b.candidate(cls.name, fns[0], entry, f'wrap_{entry}', 2, ctor=False)
         cand.operator = 'call'
-        ep = EntryPoint(entry, f'wrap_{entry}', METH_VARARGS, [cand], member='__call__',
+        ep = EntryPoint(entry, f'wrap_{entry}', METH_FASTCALL, [cand], member='__call__',
                         protocol='call')
         return ep
 
@@ -510,7 +510,8 @@ class Decider:
         for member, cands in groups.items():
             entry = f'{name}_{member}'
             unary = member in UNARY.values()
-            ep = EntryPoint(entry, f'wrap_{entry}', METH_O if unary else METH_VARARGS, cands,
+            # Two operands come as an array, without a tuple made per call.
+            ep = EntryPoint(entry, f'wrap_{entry}', METH_O if unary else METH_FASTCALL, cands,
                             member=member, protocol='unary' if unary else 'operator')
             out.append(ep)
         return out

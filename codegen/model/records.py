@@ -16,6 +16,7 @@ if TYPE_CHECKING:
 METH_VARARGS = 1
 METH_NOARGS = 4
 METH_O = 8
+METH_FASTCALL = 0x80   # the arguments as an array: the special methods of values
 
 
 @dataclass

@@ -274,6 +274,18 @@ def test_other_operands_are_for_python(c, m):
         assert getattr(obj, m.member)(other) is NotImplemented
 
 
+def test_special_methods_count_their_arguments():
+    with pytest.raises(TypeError) as e:
+        ov.VPoint.__getitem__(ov.VPoint())
+    assert str(e.value) == 'VPoint___getitem__ expected 2 arguments, got 1'
+    with pytest.raises(TypeError) as e:
+        ov.VMatrix()(1, 2, 3)
+    assert str(e.value) == 'VMatrix___call__ expected 3 arguments, got 4'
+    with pytest.raises(TypeError) as e:
+        _OpenVorla.VPoint___add__()
+    assert str(e.value) == 'VPoint___add__ expected 2 arguments, got none'
+
+
 def test_unsupported_operands_raise_as_python_does():
     with pytest.raises(TypeError) as e:
         ov.VPoint() + 'x'

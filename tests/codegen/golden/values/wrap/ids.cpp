@@ -96,18 +96,19 @@ PyObject *wrap_Tag___ne__(PyObject *, PyObject *args) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Tag___lt__(PyObject *, PyObject *args) try {
+PyObject *wrap_Tag___lt__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "Tag___lt__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("Tag___lt__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Tag, &argp1, "in method 'Tag___lt__', argument 1 of type 'Tag const *'", "invalid null reference in method 'Tag___lt__', argument 1 of type 'Tag const *'")) return nullptr;
-  if (SWIG_IsOK(swigrt::ConvertPtr(argv[1], nullptr, SWIGTYPE_p_Tag, SWIG_POINTER_NO_NULL))) {
+  {
     void *argp2 = nullptr;
-    if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Tag, &argp2, "in method 'Tag___lt__', argument 2 of type 'Tag const &'", "invalid null reference in method 'Tag___lt__', argument 2 of type 'Tag const &'")) return nullptr;
-    PyObject *resultobj = PyBool_FromLong(static_cast<Tag *>(argp1)->operator<(*static_cast<Tag const *>(argp2)));
-    if (!resultobj) return nullptr;
-    return resultobj;
+    if (swigrt::OperandPointer(argv[1], SWIGTYPE_p_Tag, &argp2)) {
+      PyObject *resultobj = PyBool_FromLong(static_cast<Tag *>(argp1)->operator<(*static_cast<Tag const *>(argp2)));
+      if (!resultobj) return nullptr;
+      return resultobj;
+    }
   }
   // Any other operand is for Python to try the other way round.
   Py_RETURN_NOTIMPLEMENTED;
@@ -449,10 +450,10 @@ PyObject *wrap_VString___str__(PyObject *, PyObject *arg) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_VString___eq__(PyObject *, PyObject *args) try {
+PyObject *wrap_VString___eq__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "VString___eq__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("VString___eq__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_VString, &argp1, "in method 'VString___eq__', argument 1 of type 'VString *'", "invalid null reference in method 'VString___eq__', argument 1 of type 'VString *'")) return nullptr;
   VString &self = *static_cast<VString *>(argp1);
@@ -465,10 +466,10 @@ PyObject *wrap_VString___eq__(PyObject *, PyObject *args) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_VString___ne__(PyObject *, PyObject *args) try {
+PyObject *wrap_VString___ne__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "VString___ne__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("VString___ne__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_VString, &argp1, "in method 'VString___ne__', argument 1 of type 'VString *'", "invalid null reference in method 'VString___ne__', argument 1 of type 'VString *'")) return nullptr;
   VString &self = *static_cast<VString *>(argp1);

@@ -165,10 +165,10 @@ PyObject *wrap_Pair___len__(PyObject *, PyObject *arg) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pair___getitem__(PyObject *, PyObject *args) try {
+PyObject *wrap_Pair___getitem__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "Pair___getitem__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("Pair___getitem__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pair, &argp1, "in method 'Pair___getitem__', argument 1 of type 'Pair *'", "invalid null reference in method 'Pair___getitem__', argument 1 of type 'Pair *'")) return nullptr;
   Pair &self = *static_cast<Pair *>(argp1);
@@ -189,10 +189,10 @@ PyObject *wrap_Pair___iter__(PyObject *, PyObject *arg) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pair___setitem__(PyObject *, PyObject *args) try {
+PyObject *wrap_Pair___setitem__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[3] = {};
-  if (!swigrt::UnpackTuple(args, "Pair___setitem__", 3, 3, argv)) return nullptr;
+  if (!swigrt::CountArgs("Pair___setitem__", 3, 3, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pair, &argp1, "in method 'Pair___setitem__', argument 1 of type 'Pair *'", "invalid null reference in method 'Pair___setitem__', argument 1 of type 'Pair *'")) return nullptr;
   Pair &self = *static_cast<Pair *>(argp1);
@@ -207,18 +207,19 @@ PyObject *wrap_Pair___setitem__(PyObject *, PyObject *args) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pair___add__(PyObject *, PyObject *args) try {
+PyObject *wrap_Pair___add__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "Pair___add__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("Pair___add__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pair, &argp1, "in method 'Pair___add__', argument 1 of type 'Pair const *'", "invalid null reference in method 'Pair___add__', argument 1 of type 'Pair const *'")) return nullptr;
-  if (SWIG_IsOK(swigrt::ConvertPtr(argv[1], nullptr, SWIGTYPE_p_Pair, SWIG_POINTER_NO_NULL))) {
+  {
     void *argp2 = nullptr;
-    if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Pair, &argp2, "in method 'Pair___add__', argument 2 of type 'Pair const &'", "invalid null reference in method 'Pair___add__', argument 2 of type 'Pair const &'")) return nullptr;
-    PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(static_cast<Pair *>(argp1)->operator+(*static_cast<Pair const *>(argp2))), SWIGTYPE_p_Pair, SWIG_POINTER_OWN);
-    if (!resultobj) return nullptr;
-    return resultobj;
+    if (swigrt::OperandPointer(argv[1], SWIGTYPE_p_Pair, &argp2)) {
+      PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(static_cast<Pair *>(argp1)->operator+(*static_cast<Pair const *>(argp2))), SWIGTYPE_p_Pair, SWIG_POINTER_OWN);
+      if (!resultobj) return nullptr;
+      return resultobj;
+    }
   }
   // Any other operand is for Python to try the other way round.
   Py_RETURN_NOTIMPLEMENTED;
@@ -239,25 +240,27 @@ PyObject *wrap_Pair___neg__(PyObject *, PyObject *arg) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pair___mul__(PyObject *, PyObject *args) try {
+PyObject *wrap_Pair___mul__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "Pair___mul__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("Pair___mul__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pair, &argp1, "in method 'Pair___mul__', argument 1 of type 'Pair const *'", "invalid null reference in method 'Pair___mul__', argument 1 of type 'Pair const *'")) return nullptr;
-  if (SWIG_IsOK(swigrt::AsNumberDouble(argv[1], nullptr))) {
+  {
     double arg2{};
-    if (!swigrt::ScalarArg(swigrt::AsNumberDouble(argv[1], &arg2), "in method 'Pair___mul__', argument 2 of type 'double'")) return nullptr;
-    PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(static_cast<Pair *>(argp1)->operator*(arg2)), SWIGTYPE_p_Pair, SWIG_POINTER_OWN);
-    if (!resultobj) return nullptr;
-    return resultobj;
+    if (SWIG_IsOK(swigrt::AsNumberDouble(argv[1], &arg2))) {
+      PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(static_cast<Pair *>(argp1)->operator*(arg2)), SWIGTYPE_p_Pair, SWIG_POINTER_OWN);
+      if (!resultobj) return nullptr;
+      return resultobj;
+    }
   }
-  if (SWIG_IsOK(swigrt::ConvertPtr(argv[1], nullptr, SWIGTYPE_p_Grid, SWIG_POINTER_NO_NULL))) {
+  {
     void *argp2 = nullptr;
-    if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Grid, &argp2, "in method 'Pair___mul__', argument 2 of type 'Grid const &'", "invalid null reference in method 'Pair___mul__', argument 2 of type 'Grid const &'")) return nullptr;
-    PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(static_cast<Pair *>(argp1)->operator*(*static_cast<Grid const *>(argp2))), SWIGTYPE_p_Pair, SWIG_POINTER_OWN);
-    if (!resultobj) return nullptr;
-    return resultobj;
+    if (swigrt::OperandPointer(argv[1], SWIGTYPE_p_Grid, &argp2)) {
+      PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(static_cast<Pair *>(argp1)->operator*(*static_cast<Grid const *>(argp2))), SWIGTYPE_p_Pair, SWIG_POINTER_OWN);
+      if (!resultobj) return nullptr;
+      return resultobj;
+    }
   }
   // Any other operand is for Python to try the other way round.
   Py_RETURN_NOTIMPLEMENTED;
@@ -265,18 +268,19 @@ PyObject *wrap_Pair___mul__(PyObject *, PyObject *args) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pair___rmul__(PyObject *, PyObject *args) try {
+PyObject *wrap_Pair___rmul__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "Pair___rmul__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("Pair___rmul__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pair, &argp1, "in method 'Pair___rmul__', argument 1 of type 'Pair const *'", "invalid null reference in method 'Pair___rmul__', argument 1 of type 'Pair const *'")) return nullptr;
-  if (SWIG_IsOK(swigrt::AsNumberDouble(argv[1], nullptr))) {
+  {
     double arg2{};
-    if (!swigrt::ScalarArg(swigrt::AsNumberDouble(argv[1], &arg2), "in method 'Pair___rmul__', argument 2 of type 'double'")) return nullptr;
-    PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(operator*(arg2, *static_cast<Pair *>(argp1))), SWIGTYPE_p_Pair, SWIG_POINTER_OWN);
-    if (!resultobj) return nullptr;
-    return resultobj;
+    if (SWIG_IsOK(swigrt::AsNumberDouble(argv[1], &arg2))) {
+      PyObject *resultobj = swigrt::NewPointerObj(nullptr, new Pair(operator*(arg2, *static_cast<Pair *>(argp1))), SWIGTYPE_p_Pair, SWIG_POINTER_OWN);
+      if (!resultobj) return nullptr;
+      return resultobj;
+    }
   }
   // Any other operand is for Python to try the other way round.
   Py_RETURN_NOTIMPLEMENTED;
@@ -284,18 +288,19 @@ PyObject *wrap_Pair___rmul__(PyObject *, PyObject *args) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Pair___mod__(PyObject *, PyObject *args) try {
+PyObject *wrap_Pair___mod__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "Pair___mod__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("Pair___mod__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Pair, &argp1, "in method 'Pair___mod__', argument 1 of type 'Pair const *'", "invalid null reference in method 'Pair___mod__', argument 1 of type 'Pair const *'")) return nullptr;
-  if (SWIG_IsOK(swigrt::ConvertPtr(argv[1], nullptr, SWIGTYPE_p_Pair, SWIG_POINTER_NO_NULL))) {
+  {
     void *argp2 = nullptr;
-    if (!swigrt::ReferenceArg(argv[1], SWIGTYPE_p_Pair, &argp2, "in method 'Pair___mod__', argument 2 of type 'Pair const &'", "invalid null reference in method 'Pair___mod__', argument 2 of type 'Pair const &'")) return nullptr;
-    PyObject *resultobj = PyFloat_FromDouble(operator%(*static_cast<Pair *>(argp1), *static_cast<Pair const *>(argp2)));
-    if (!resultobj) return nullptr;
-    return resultobj;
+    if (swigrt::OperandPointer(argv[1], SWIGTYPE_p_Pair, &argp2)) {
+      PyObject *resultobj = PyFloat_FromDouble(operator%(*static_cast<Pair *>(argp1), *static_cast<Pair const *>(argp2)));
+      if (!resultobj) return nullptr;
+      return resultobj;
+    }
   }
   // Any other operand is for Python to try the other way round.
   Py_RETURN_NOTIMPLEMENTED;
@@ -406,10 +411,10 @@ PyObject *wrap_Grid___len__(PyObject *, PyObject *arg) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Grid___getitem__(PyObject *, PyObject *args) try {
+PyObject *wrap_Grid___getitem__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "Grid___getitem__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("Grid___getitem__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Grid, &argp1, "in method 'Grid___getitem__', argument 1 of type 'Grid *'", "invalid null reference in method 'Grid___getitem__', argument 1 of type 'Grid *'")) return nullptr;
   Grid &self = *static_cast<Grid *>(argp1);
@@ -438,10 +443,10 @@ PyObject *wrap_Grid___iter__(PyObject *, PyObject *arg) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Grid___setitem__(PyObject *, PyObject *args) try {
+PyObject *wrap_Grid___setitem__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[3] = {};
-  if (!swigrt::UnpackTuple(args, "Grid___setitem__", 3, 3, argv)) return nullptr;
+  if (!swigrt::CountArgs("Grid___setitem__", 3, 3, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Grid, &argp1, "in method 'Grid___setitem__', argument 1 of type 'Grid *'", "invalid null reference in method 'Grid___setitem__', argument 1 of type 'Grid *'")) return nullptr;
   Grid &self = *static_cast<Grid *>(argp1);
@@ -456,10 +461,10 @@ PyObject *wrap_Grid___setitem__(PyObject *, PyObject *args) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_Grid___call__(PyObject *, PyObject *args) try {
+PyObject *wrap_Grid___call__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[3] = {};
-  if (!swigrt::UnpackTuple(args, "Grid___call__", 3, 3, argv)) return nullptr;
+  if (!swigrt::CountArgs("Grid___call__", 3, 3, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Grid, &argp1, "in method 'Grid___call__', argument 1 of type 'Grid const *'", "invalid null reference in method 'Grid___call__', argument 1 of type 'Grid const *'")) return nullptr;
   unsigned int arg2{};
@@ -583,10 +588,10 @@ PyObject *wrap_PairArray___len__(PyObject *, PyObject *arg) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_PairArray___getitem__(PyObject *, PyObject *args) try {
+PyObject *wrap_PairArray___getitem__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[2] = {};
-  if (!swigrt::UnpackTuple(args, "PairArray___getitem__", 2, 2, argv)) return nullptr;
+  if (!swigrt::CountArgs("PairArray___getitem__", 2, 2, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_PairArray, &argp1, "in method 'PairArray___getitem__', argument 1 of type 'PairArray *'", "invalid null reference in method 'PairArray___getitem__', argument 1 of type 'PairArray *'")) return nullptr;
   PairArray &self = *static_cast<PairArray *>(argp1);
@@ -613,10 +618,10 @@ PyObject *wrap_PairArray___iter__(PyObject *, PyObject *arg) try {
   return swigrt::ExceptionResult();
 }
 
-PyObject *wrap_PairArray___setitem__(PyObject *, PyObject *args) try {
+PyObject *wrap_PairArray___setitem__(PyObject *, PyObject *const *args, Py_ssize_t nargs) try {
   swigrt::CallScope scope;
-  PyObject *argv[3] = {};
-  if (!swigrt::UnpackTuple(args, "PairArray___setitem__", 3, 3, argv)) return nullptr;
+  if (!swigrt::CountArgs("PairArray___setitem__", 3, 3, nargs)) return nullptr;
+  PyObject *const *argv = args;
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_PairArray, &argp1, "in method 'PairArray___setitem__', argument 1 of type 'PairArray *'", "invalid null reference in method 'PairArray___setitem__', argument 1 of type 'PairArray *'")) return nullptr;
   PairArray &self = *static_cast<PairArray *>(argp1);
