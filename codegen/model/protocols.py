@@ -47,9 +47,6 @@ ORDERING = {'operator<': '__lt__', 'operator<=': '__le__', 'operator>': '__gt__'
             'operator>=': '__ge__'}
 # The integral results a hash may read.
 _HASHED = frozenset({'PyLong_FromLong', 'PyLong_FromSize_t', 'PyBool_FromLong'})
-# Arrays longer than this show their ends only, as numpy shows them.
-REPR_EDGE = 3
-REPR_LIMIT = 1000
 
 
 @dataclass
@@ -84,7 +81,6 @@ class Shape:
     fields: list[str] = field(default_factory=list)   # components, in order
     counts: tuple[int, int] | None = None   # components: the numbers its constructor takes
     dims: tuple[int, ...] = ()    # grid: its dimensions
-    built: bool = False           # grid: an array constructor makes it from numbers
     length: str = ''              # array: the member counting elements
     append: str = ''              # array: the member adding one, to build it from a sequence
     assign: str = ''              # 'index' (a writable operator[] / operator()), 'set', ''
@@ -309,7 +305,7 @@ class Decider:
             return None
         element = self.element(call[0].result)
         python = of(Generic('_Sequence', (of(Generic('_Sequence', (element.taken,))),)))
-        return Shape('grid', element, dims[0], dims=dims, built=True,
+        return Shape('grid', element, dims[0], dims=dims,
                      assign='index' if any(_writable(fn) for fn in call) else '',
                      reader=reader(name), python=python,
                      index_cpp=spell(_naked(call[0].params[0].type)))
@@ -569,10 +565,11 @@ class Decider:
                 p.repr = self.call_repr(c.name) or ValueRepr('shape')
             elif p.shape:
                 p.repr = ValueRepr('shape')
-        for c in self.classes:
-            p = self.protocols[c.name]
-            if p.repr is None:
-                p.repr = self.call_repr(c.name)
+        for _ in range(2):   # a call may show another class's call
+            for c in self.classes:
+                p = self.protocols[c.name]
+                if p.repr is None:
+                    p.repr = self.call_repr(c.name)
         for c in self.classes:
             p = self.protocols[c.name]
             if p.repr is None:
