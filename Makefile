@@ -52,7 +52,7 @@ test-asan: build-asan
 	  $(foreach p,$(EXAMPLES),--plugin examples/plugins/$(p).py) examples/scenes/demo.py >/dev/null
 
 EXAMPLES := sine_node offset_command vector_data text_translator wave_deformer \
-            marker_locator snap_transform scatter_command
+            marker_locator snap_transform scatter_command point_cloud
 
 demo: build
 	$(BUILD)/bin/vorla $(foreach p,$(EXAMPLES),--plugin examples/plugins/$(p).py) \
@@ -65,6 +65,7 @@ bench: build
 	cmake --build $(BUILD) --target bench-modules
 	$(PYTHON) bench/bench_calls.py --build $(BUILD)
 	$(PYTHON) bench/bench_app.py --build $(BUILD)
+	$(PYTHON) bench/bench_values.py --build $(BUILD)
 
 clean:
 	rm -rf $(BUILD) $(ASAN_BUILD)

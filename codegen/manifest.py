@@ -41,6 +41,13 @@ class Manifest:
     resource_table: str = ''
     resources: list[str] = field(default_factory=list)
     handwritten: dict[str, list[str]] = field(default_factory=dict)  # class -> members in wrap/
+    # The classes behave as Python values: their operators, subscripts, lengths,
+    # reprs and hashes are Python's, and sequences of the right shape stand for
+    # them where they are taken.
+    value_protocols: bool = False
+    # Booleans take only bool, numbers only what Python's number protocols
+    # make a number of, and text only str: a wrong one stops the call.
+    strict_scalars: bool = False
     source: str = ''               # manifest path as given, for banners
 
 
@@ -76,6 +83,8 @@ def load(path: str, display_name: str | None = None) -> Manifest:
             resource_table=mod.get('resource_table', ''),
             resources=list(mod.get('resources', [])),
             handwritten={k: list(v) for k, v in data.get('handwritten', {}).items()},
+            value_protocols=bool(mod.get('value_protocols', False)),
+            strict_scalars=bool(mod.get('strict_scalars', False)),
             source=display_name or path)
     except KeyError as e:
         raise ManifestError(f'{path}: missing key {e}') from None

@@ -108,6 +108,9 @@ class Class:
 class Headers:
     classes: dict[str, Class]
     macros: dict[str, str]      # object-like macros: name -> replacement text
+    # Operators declared outside the classes (`VVector operator*(double, const
+    # VVector &)`), in the order the headers declare them.
+    operators: list[Function] = field(default_factory=list)
 
 
 class ParseError(Exception):
@@ -300,6 +303,7 @@ def parse(headers: list[str], include_dirs: list[str], namespace: str,
 
     classes: dict[str, Class] = {}
     macros: dict[str, str] = {}
+    operators: list[Function] = []
 
     def visit(cursor):
         for c in cursor.get_children():
@@ -310,10 +314,13 @@ def parse(headers: list[str], include_dirs: list[str], namespace: str,
                 if header is not None:
                     cls = reader.read_class(c, header)
                     classes[cls.name] = cls
+            elif c.kind == K.FUNCTION_DECL and c.spelling.startswith('operator') and \
+                    reader.header_of(c) is not None:
+                operators.append(reader.function(c, True))
             elif c.kind == K.MACRO_DEFINITION and reader.header_of(c) is not None:
                 tokens = [t.spelling for t in c.get_tokens()]
                 if len(tokens) >= 2 and tokens[1] != '(':
                     macros[tokens[0]] = ' '.join(tokens[1:])
 
     visit(tu.cursor)
-    return Headers(classes, macros)
+    return Headers(classes, macros, operators)

@@ -40,6 +40,16 @@ void SetErrorMessage(PyObject *errtype, const char *message);
 Py_ssize_t UnpackTupleChecked(PyObject *args, const char *name, Py_ssize_t min, Py_ssize_t max,
                               PyObject **objs);
 
+// The count check of an entry point taking its arguments as an array
+// (METH_FASTCALL), with UnpackTuple's messages.
+bool CountArgs(const char *name, Py_ssize_t min, Py_ssize_t max, Py_ssize_t nargs);
+
+// Such an entry point as a method table stores it (the flags tell the
+// interpreter its real type).
+inline PyCFunction FastEntry(PyObject *(*entry)(PyObject *, PyObject *const *, Py_ssize_t)) {
+  return reinterpret_cast<PyCFunction>(reinterpret_cast<void (*)()>(entry));
+}
+
 // The common case inline: a tuple of an accepted length. Everything else,
 // and every message, is UnpackTupleChecked's.
 inline Py_ssize_t UnpackTuple(PyObject *args, const char *name, Py_ssize_t min, Py_ssize_t max,

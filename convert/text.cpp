@@ -42,6 +42,73 @@ bool DirectText(PyObject *str, Tstring &out) {
   return true;
 }
 
+namespace {
+
+swig_type_info *StringDescriptor() {
+  static bool looked_up = false;
+  static swig_type_info *descriptor = nullptr;
+  if (!looked_up) {
+    descriptor = TypeQuery("_p_VString");
+    looked_up = true;
+  }
+  return descriptor;
+}
+
+const StringType *WrappedString(PyObject *obj) {
+  swig_type_info *ty = StringDescriptor();
+  void *ptr = nullptr;
+  if (!ty || PyUnicode_Check(obj) || !SWIG_IsOK(ConvertPtr(obj, &ptr, ty, 0))) return nullptr;
+  return static_cast<const StringType *>(ptr);
+}
+
+}  // namespace
+
+bool IsText(PyObject *obj) { return PyUnicode_Check(obj) || WrappedString(obj); }
+
+bool StrictStringArg(PyObject *obj, StringType &out, const char *message) {
+  if (PyUnicode_Check(obj)) {
+    Tstring &text = out;
+    if (DirectText(obj, text)) return true;
+  } else if (const StringType *s = WrappedString(obj)) {
+    out = *s;
+    return true;
+  }
+  PyErr_SetString(PyExc_TypeError, message);
+  return false;
+}
+
+bool IsTextList(PyObject *obj) {
+  if (!PyList_Check(obj) && !PyTuple_Check(obj)) return false;
+  PyObject *fast = PySequence_Fast(obj, "");
+  if (!fast) {
+    PyErr_Clear();
+    return false;
+  }
+  bool ok = true;
+  for (Py_ssize_t i = 0; ok && i < PySequence_Fast_GET_SIZE(fast); ++i)
+    ok = IsText(PySequence_Fast_GET_ITEM(fast, i));
+  Py_DECREF(fast);
+  return ok;
+}
+
+bool StrictStringArrayArg(PyObject *obj, StringArrayType &out, const char *message) {
+  if (!IsTextList(obj)) {
+    PyErr_SetString(PyExc_TypeError, message);
+    return false;
+  }
+  PyObject *fast = PySequence_Fast(obj, "");
+  if (!fast) return false;
+  bool ok = true;
+  for (Py_ssize_t i = 0; ok && i < PySequence_Fast_GET_SIZE(fast); ++i) {
+    StringType item;
+    ok = StrictStringArg(PySequence_Fast_GET_ITEM(fast, i), item, message) &&
+         !out.append(item).error();
+  }
+  Py_DECREF(fast);
+  if (!ok && !PyErr_Occurred()) PyErr_SetString(PyExc_TypeError, message);
+  return ok;
+}
+
 PyObject *UnknownString() {
   static PyObject *unknown = PyUnicode_InternFromString("unknown");
   return unknown;

@@ -3,7 +3,8 @@
 //
 // A string argument that does not convert sets TypeError and the call goes
 // on with an empty value: the host engine's conversions have always worked
-// that way, and plug-ins rely on the host running regardless.
+// that way, and plug-ins rely on the host running regardless. A module whose
+// scalars are strict stops the call instead (the Strict routines).
 #pragma once
 
 #include <openvorla/VStatus.h>
@@ -42,6 +43,14 @@ inline PyObject *FromString(const StringType &s) {
 }
 
 PyObject *FromStringArray(const StringArrayType &array);
+
+// Strict text: a str, or a wrapped host string. False, with TypeError and
+// `message` set, for anything else; nothing is left pending.
+bool IsText(PyObject *obj);
+bool StrictStringArg(PyObject *obj, StringType &out, const char *message);
+// A list or tuple of such text.
+bool IsTextList(PyObject *obj);
+bool StrictStringArrayArg(PyObject *obj, StringArrayType &out, const char *message);
 
 // The interned "unknown", which a status of code 5 becomes.
 PyObject *UnknownString();

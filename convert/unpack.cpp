@@ -48,4 +48,17 @@ Py_ssize_t UnpackTupleChecked(PyObject *args, const char *name, Py_ssize_t min, 
   return n + 1;
 }
 
+bool CountArgs(const char *name, Py_ssize_t min, Py_ssize_t max, Py_ssize_t nargs) {
+  if (nargs >= min && nargs <= max) return true;
+  const bool exact = min == max;
+  if (nargs == 0)
+    PyErr_Format(PyExc_TypeError, "%s expected %s%d arguments, got none", name,
+                 exact ? "" : "at least ", static_cast<int>(min));
+  else
+    PyErr_Format(PyExc_TypeError, "%s expected %s%d arguments, got %d", name,
+                 exact ? "" : nargs < min ? "at least " : "at most ",
+                 static_cast<int>(nargs < min ? min : max), static_cast<int>(nargs));
+  return false;
+}
+
 }  // namespace swigrt

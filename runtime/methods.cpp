@@ -32,6 +32,9 @@ PyObject *Call(PyObject *self, PyObject *const *args, size_t nargsf, PyObject *k
   Py_ssize_t nargs = PyVectorcall_NARGS(nargsf);
   if (!kwnames) {
     if (m->flags == METH_O && nargs == 1) return m->cfunc(m->cself, args[0]);
+    if (m->flags == METH_FASTCALL)
+      return reinterpret_cast<_PyCFunctionFast>(reinterpret_cast<void (*)()>(m->cfunc))(
+          m->cself, args, nargs);
     if (m->flags == METH_VARARGS) {
       PyObject *tuple = PyTuple_New(nargs);
       if (!tuple) return nullptr;

@@ -3,6 +3,7 @@ destruction, hand-over to the host and class registration; and the entry
 points of the pointer classes."""
 from __future__ import annotations
 
+from . import protocols
 from .common import banner, c_string, namespace_close, namespace_open
 from ..model import (METH_NOARGS, METH_O, REFUSE_PLAIN, Arg, Candidate, DispatchRule, EntryPoint,
                      Module, PointerClass, WrappedClass)
@@ -34,6 +35,20 @@ def _convert(a: Arg) -> str:
         local = f'  {a.cpp} arg{n}' + (f' = {a.default};\n' if a.default else '{};\n')
         call = f'swigrt::ScalarArg(swigrt::{a.converter}({slot}, &arg{n}), {c_string(a.message)})'
         return f'{local}  if ({present}!{call}) return nullptr;\n'
+    if a.kind == 'object' and a.numbers:
+        cells = ''.join(f'[{d}]' for d in a.shape)
+        dims = '{' + ', '.join(str(d) for d in a.shape) + '}'
+        return (f'  {a.numbers[0]} numbers{n}{cells};\n  void *argp{n} = nullptr;\n'
+                f'  if ({present}!swigrt::GridArg({slot}, {a.descriptor.macro}, &argp{n}, '
+                f'&numbers{n}{"[0]" * len(a.shape)}, {dims}, swigrt::{a.numbers[1]},\n'
+                f'                             {c_string(a.message)}, '
+                f'{c_string(a.null_message)})) return nullptr;\n')
+    if a.kind == 'object' and a.sequence:
+        return (f'  void *argp{n} = nullptr;\n  {a.value_type} sequence{n};\n'
+                f'  if ({present}!swigrt::ValueArg({slot}, {a.descriptor.macro}, &argp{n}, '
+                f'sequence{n}, {a.sequence},\n'
+                f'                              {c_string(a.message)}, '
+                f'{c_string(a.null_message)})) return nullptr;\n')
     if a.kind == 'object':
         descriptor = a.descriptor.macro if a.descriptor else 'nullptr'
         if a.reference:
@@ -44,6 +59,22 @@ def _convert(a: Arg) -> str:
             call = (f'swigrt::PointerArg({slot}, {descriptor}, {flags}, &argp{n}, '
                     f'{c_string(a.message)})')
         return f'  void *argp{n} = nullptr;\n  if ({present}!{call}) return nullptr;\n'
+    if a.kind in ('string', 'string_ptr') and a.strict:
+        if a.kind == 'string_ptr':
+            return (f'  VString arg{n};\n'
+                    f'  const bool has{n} = {slot} && {slot} != Py_None;\n'
+                    f'  if (has{n} && !swigrt::StrictStringArg({slot}, arg{n}, '
+                    f'{c_string(a.message)})) return nullptr;\n')
+        local = f'  VString arg{n} = {a.default};\n' if a.default else f'  VString arg{n};\n'
+        return (local + f'  if ({present}!swigrt::StrictStringArg({slot}, arg{n}, '
+                f'{c_string(a.message)})) return nullptr;\n')
+    if a.kind == 'string_array' and a.strict:
+        return (f'  VStringArray arg{n};\n'
+                f'  if (!swigrt::StrictStringArrayArg({slot}, arg{n}, {c_string(a.message)})) '
+                'return nullptr;\n')
+    if a.kind == 'array_out':
+        cells = ''.join(f'[{d}]' for d in a.shape)
+        return f'  {a.cpp} arg{n}{cells} = {{}};\n'
     if a.kind == 'string':
         if a.default:
             return (f'  VString arg{n} = {a.default};\n'
@@ -89,6 +120,7 @@ def _value(a: Arg) -> str:
         'status_out': lambda: f'&status{n}',
         'callable': lambda: f'arg{n}',
         'pyobject': lambda: _slot(a),
+        'array_out': lambda: f'arg{n}',
     }[a.kind]()
 
 
@@ -105,17 +137,23 @@ def _check_present(a: Arg) -> str:
         return f'PyCallable_Check({slot})'
     if a.kind == 'scalar':
         return f'SWIG_IsOK(swigrt::{a.converter}({slot}, nullptr))'
+    if a.kind == 'object' and a.numbers:
+        dims = '{' + ', '.join(str(d) for d in a.shape) + '}'
+        return f'swigrt::GridCheck({slot}, {a.descriptor.macro}, {dims}, swigrt::{a.numbers[1]})'
+    if a.kind == 'object' and a.sequence:
+        return f'swigrt::ValueCheck({slot}, {a.descriptor.macro}, {a.sequence})'
     if a.kind == 'object':
         flags = 'SWIG_POINTER_NO_NULL' if a.reference else '0'
         descriptor = a.descriptor.macro if a.descriptor else 'nullptr'
         return f'SWIG_IsOK(swigrt::ConvertPtr({slot}, nullptr, {descriptor}, {flags}))'
     if a.kind == 'chars':
         return f'SWIG_IsOK(swigrt::AsCharPtr({slot}, nullptr))'
+    text = 'swigrt::IsText' if a.strict else 'PyUnicode_Check'
     if a.kind == 'string':
-        return f'PyUnicode_Check({slot})'
+        return f'{text}({slot})'
     if a.kind == 'string_ptr':
-        return f'({slot} == Py_None || PyUnicode_Check({slot}))'
-    return f'PyList_Check({slot})'
+        return f'({slot} == Py_None || {text}({slot}))'
+    return f'swigrt::IsTextList({slot})' if a.strict else f'PyList_Check({slot})'
 
 
 def _result(c: Candidate, call: str, declare: bool = True) -> str:
@@ -125,6 +163,11 @@ def _result(c: Candidate, call: str, declare: bool = True) -> str:
     target = 'PyObject *resultobj' if declare else 'resultobj'
     if r.kind == 'void':
         return f'  {call};\n  {target} = Py_NewRef(Py_None);\n'
+    if r.kind == 'status' and any(a.kind == 'array_out' for a in c.args):
+        # What the host fills is the result: any failure is an error.
+        return (f'  VStatus result = {call};\n'
+                '  if (!swigrt::StatusSucceeded(result)) return nullptr;\n'
+                f'  {target} = Py_NewRef(Py_None);\n')
     if r.kind == 'status':
         return (f'  VStatus result = {call};\n'
                 f'  {target} = swigrt::StatusResult(result);\n'
@@ -156,11 +199,25 @@ def _after(c: Candidate) -> str:
                        f'{c_string(not_list)},\n'
                        f'                                {c_string(cannot)})) {{\n'
                        '    Py_DECREF(resultobj);\n    return nullptr;\n  }\n')
+    filled = [a for a in c.args if a.kind == 'array_out']
+    if filled:
+        lists = ', '.join(
+            f'swigrt::GridList(&arg{a.number}{"[0]" * len(a.shape)}, '
+            f'{{{", ".join(str(d) for d in a.shape)}}}, '
+            f'[]({a.cpp} v) {{ return {_make_number(a.converter, "v")}; }})' for a in filled)
+        out.append(f'  resultobj = swigrt::WithOutputs(resultobj, {{{lists}}});\n'
+                   '  if (!resultobj) return nullptr;\n')
     for a in c.args:
         if a.kind == 'status_out':
             out.append(f'  if (!swigrt::StatusSucceeded(status{a.number})) {{\n'
                        '    Py_DECREF(resultobj);\n    return nullptr;\n  }\n')
     return ''.join(out)
+
+
+def _make_number(converter: str, value: str) -> str:
+    if converter == 'PyLong_FromLong':
+        return f'PyLong_FromLong(static_cast<long>({value}))'
+    return f'{converter}({value})'
 
 
 def _construct(cls: str, ep: EntryPoint, c: Candidate, values: str) -> str:
@@ -316,7 +373,11 @@ def _class(cls: WrappedClass) -> str:
                f'  if (!swigrt::PointerArg(arg, {d}, SWIG_POINTER_DISOWN | SWIG_POINTER_FORGET, '
                f'&argp1, {msg})) return nullptr;\n'
                f'  delete static_cast<{cls.name} *>(argp1);\n  Py_RETURN_NONE;\n' + _CLOSE + '\n')
-    out += [entry_point(cls.name, m) + '\n' for m in cls.members if m.candidates]
+    functions = protocols.functions(cls)
+    if functions:
+        out.append(functions)
+    out += [(protocols.entry_point(cls, m) if m.protocol else entry_point(cls.name, m)) + '\n'
+            for m in cls.members if m.candidates or m.protocol]
     if cls.director:
         msg = c_string(f"in method 'disown_{cls.name}', argument 1 of type '{cls.name} *'")
         out.append(_open(f'wrap_disown_{cls.name}', 'arg') +

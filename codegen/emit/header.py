@@ -2,8 +2,8 @@
 from __future__ import annotations
 
 from .common import banner, namespace_close, namespace_open
-from . import directors, variables
-from ..model import Module
+from . import directors, protocols, variables
+from ..model import METH_FASTCALL, Module
 
 
 def emit(module: Module) -> str:
@@ -11,6 +11,9 @@ def emit(module: Module) -> str:
            '#include <map>\n#include <string>\n\n'
            '#include "swigrt.h"\n#include "errors.h"\n#include "args.h"\n#include "dispatch.h"\n'
            '#include "scalars.h"\n#include "text.h"\n'
+           + ('#include "numbers.h"\n' if module.strict_scalars else '')
+           + ('#include "sequences.h"\n#include "values.h"\n\n#include <limits>\n'
+              if module.value_protocols else '')
            + ('#include <scriptrunner/TstringId.h>\n' if module.resources else '')
            + ('#include "director.h"\n#include "forward.h"\n' if module.directors else '') + '\n']
     out += [f'#include <{h}>\n' for h in module.headers]
@@ -23,8 +26,14 @@ def emit(module: Module) -> str:
     out += [f'#define {d.macro} swig_types[{d.index}]\n' for d in module.descriptors]
     out.append('\n')
     for e in module.entries:
-        if not e.function.startswith('swigrt::'):
+        if e.flags == METH_FASTCALL:
+            out.append(f'PyObject *{e.function}(PyObject *self, PyObject *const *args, '
+                       'Py_ssize_t nargs);\n')
+        elif not e.function.startswith('swigrt::'):
             out.append(f'PyObject *{e.function}(PyObject *self, PyObject *args);\n')
+    shared = ''.join(protocols.declarations(c) for c in module.classes)
+    if shared:
+        out.append('\n// Sequences read into values, and hashes of values, for every family.\n' + shared)
     if module.variables:
         out.append('\n')
     for v in module.variables:

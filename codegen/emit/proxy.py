@@ -32,7 +32,7 @@ def _proxy_repr(self):
     except AttributeError:
         this = 'no object'
     return f'<{{type(self).__module__}}.{{type(self).__qualname__}}; proxy of {{this}} >'
-
+{value_repr}
 
 class _static_variable:
     """A static variable of the host class, read through the class or an
@@ -55,8 +55,21 @@ class _static_variable:
 cvar = _ext.cvar
 '''
 
-_COMMON = ('    thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")\n'
-           '    __repr__ = _proxy_repr\n\n')
+_THISOWN = '    thisown = property(_thisown_get, _thisown_set, doc="True when Python owns the object")\n'
+_COMMON = _THISOWN + '    __repr__ = _proxy_repr\n\n'
+
+# With value protocols, a class showing its value: an object that no longer
+# has one (deleted by the host) shows as any proxy does.
+_VALUE_REPR = '''
+
+def _value_repr(entry):
+    def __repr__(self):
+        try:
+            return entry(self)
+        except ValueError:
+            return _proxy_repr(self)
+    return __repr__
+'''
 
 
 def _class(cls: WrappedClass) -> str:
@@ -65,7 +78,9 @@ def _class(cls: WrappedClass) -> str:
     out = [f'\nclass {n}({base}):\n']
     if cls.doc:
         out.append(f'    {cls.doc!r}\n\n')
-    out.append(_COMMON)
+    shows = any(m.protocol == 'repr' for m in cls.members)
+    out.append(_THISOWN + (f'    __repr__ = _value_repr(_ext.{n}___repr__)\n\n' if shows
+                           else '    __repr__ = _proxy_repr\n\n'))
     ctor = cls.constructor
     if ctor is None:
         out.append('    def __init__(self, *args, **kwargs):\n'
@@ -85,6 +100,8 @@ def _class(cls: WrappedClass) -> str:
             if m.accessor == 'get':
                 doc = f', None, {m.doc!r}' if m.doc else ''
                 out.append(f'    {m.field} = property(_ext.{m.entry}, _ext.{m.entry[:-4]}_set{doc})\n')
+            continue
+        if m.protocol == 'repr':
             continue
         if m.static:
             out.append(f'    {m.member} = _ext.{m.entry}\n')
@@ -127,7 +144,8 @@ def emit(module: Module) -> str:
     imports = ''.join(f'from . import {m}\n' for m in module.imports)
     out = [banner(module, f'Python classes over {module.name}', '#'),
            f'"""Python classes of the {module.proxy} interface."""\n',
-           _PRELUDE.format(ext=module.name, imports=imports)]
+           _PRELUDE.format(ext=module.name, imports=imports,
+                           value_repr=_VALUE_REPR if module.value_protocols else '')]
     out += [f'{c.name} = _ext.{c.name}\n' for c in module.start_constants
             if isinstance(c.value, str)]
     out += [_pointer_class(p) for p in module.pointer_classes]

@@ -7,12 +7,18 @@ from ..model import EntryPoint, MethodEntry, Module, PointerClass, WrappedClass
 from ..model.pytypes import PySignature, PyType
 
 _TYPING = 'from typing import Any, Callable, ClassVar, Literal, overload\n'
+# Protocols show iterators.
+_TYPING_VALUES = 'from typing import Any, Callable, ClassVar, Iterator, Literal, overload\n'
 _THISOWN = ('    this: _SwigPyObject\n'
             '    @property\n'
             '    def thisown(self) -> bool: ...\n'
             '    @thisown.setter\n'
             '    def thisown(self, value: bool) -> None: ...\n'
             '    def __repr__(self) -> str: ...\n')
+
+
+def _typing(module: Module) -> str:
+    return _TYPING_VALUES if module.value_protocols else _TYPING
 
 
 def _docstring(text: str, indent: str) -> str:
@@ -41,7 +47,7 @@ def _def(sig: PySignature, home: str, indent: str, first: list[str], name: str =
 
 
 def _member(m: EntryPoint, home: str) -> str:
-    if not m.candidates:   # written by hand: its arguments are its own business
+    if not m.candidates and not m.forms:   # written by hand: its arguments are its own business
         return f'    def {m.member}(self, *args: Any) -> Any: ...\n'
     first = [] if m.static else ['self']
     static = ('staticmethod',) if m.static else ()
@@ -81,7 +87,7 @@ def _class(c: WrappedClass, home: str) -> str:
     for m in c.members:
         if m.accessor == 'get':
             out.append(_property(m, setters[m.field], home))
-        elif not m.accessor:
+        elif not m.accessor and m.protocol != 'repr':   # every class has its __repr__
             out.append(_member(m, home))
     out += [f'    {k.name[len(c.name) + 1:]}: {type(k.value).__name__}\n' for k in c.constants]
     out += [f'    {v.name[len(c.name) + 1:]}: ClassVar[{v.python.render(home, True)}]\n'
@@ -118,6 +124,9 @@ def _types(module: Module) -> list[PyType]:
         for ep in ([c.constructor] if c.constructor else []) + c.members:
             for cand in ep.candidates:
                 out += cand.python.types
+            if not ep.candidates:
+                for form in ep.forms:
+                    out += form.types
         out += [v.python for v in c.variables]
     for p in module.pointer_classes:
         for sig, _ in p.python:
@@ -143,7 +152,7 @@ def emit_proxy(module: Module) -> str:
     types = _types(module)
     out = [banner(module, f'type stubs of {module.proxy}', '#'),
            f'"""Python classes of the {module.proxy} interface."""\n',
-           _TYPING, '\n', f'from . import {module.name}\n', _imports(module, types, False),
+           _typing(module), '\n', f'from . import {module.name}\n', _imports(module, types, False),
            f'\ncvar: {module.name}._Variables\n']
     out += [f'{k.name}: str\n' for k in module.start_constants if isinstance(k.value, str)]
     out += [_pointer_class(p, home) for p in module.pointer_classes]
@@ -154,7 +163,7 @@ def emit_proxy(module: Module) -> str:
 def _flat(e: MethodEntry, typed: dict[str, tuple[EntryPoint, WrappedClass]], home: str,
           proxy: str) -> str:
     found = typed.get(e.name)
-    if found is None or not found[0].candidates:
+    if found is None or not found[0].forms:
         params = {8: 'arg: Any, /', 4: ''}.get(e.flags, '*args: Any')
         return f'def {e.name}({params}) -> Any: ...\n'
     ep, c = found
@@ -179,7 +188,7 @@ def emit_extension(module: Module) -> str:
             typed[ep.entry] = (ep, c)
     out = [banner(module, f'type stubs of {module.name}', '#'),
            f'"""The flat built-ins of {module.proxy}, its constants and its variables."""\n',
-           _TYPING, '\n', _imports(module, types, True),
+           _typing(module), '\n', _imports(module, types, True),
            _values(module, home), '\n']
     out += [_flat(e, typed, home, module.proxy) for e in module.entries]
     return ''.join(out)

@@ -2,12 +2,15 @@
 from __future__ import annotations
 
 from .common import banner, c_string, namespace_close, namespace_open
-from ..model import Module, MethodEntry, METH_NOARGS, METH_O, METH_VARARGS
+from ..model import Module, MethodEntry, METH_FASTCALL, METH_NOARGS, METH_O, METH_VARARGS
 
-_FLAGS = {METH_VARARGS: 'METH_VARARGS', METH_NOARGS: 'METH_NOARGS', METH_O: 'METH_O'}
+_FLAGS = {METH_VARARGS: 'METH_VARARGS', METH_NOARGS: 'METH_NOARGS', METH_O: 'METH_O',
+          METH_FASTCALL: 'METH_FASTCALL'}
 
 
 def _function(e: MethodEntry) -> str:
+    if e.flags == METH_FASTCALL:   # generated, and stored as every entry is
+        return f'swigrt::FastEntry({e.function})'
     if e.catches or e.function.startswith('swigrt::'):
         return e.function
     return f'swigrt::Safe<{e.function}>'

@@ -6,13 +6,13 @@ their cast lists, installation order. Emitters only print what it builds."""
 from ..parse import CType
 from .builder import OVERLOAD_HEAD, REFUSE_PLAIN, build
 from .naming import GeneratorError, c_string, pointer_descriptor_name, spell
-from .records import (METH_NOARGS, METH_O, METH_VARARGS, Arg, Candidate, Cast, Companion,
+from .records import (METH_FASTCALL, METH_NOARGS, METH_O, METH_VARARGS, Arg, Candidate, Cast, Companion,
                       Constant, Descriptor, DirectorClass, DispatchRule, EntryPoint, Forward,
                       ForwardArg, ForwardResult, GlobalVariable, MethodEntry, Module,
                       PointerClass, Result, WrappedClass)
 
 __all__ = ['CType', 'OVERLOAD_HEAD', 'REFUSE_PLAIN', 'build', 'GeneratorError', 'c_string',
-           'pointer_descriptor_name', 'spell', 'METH_NOARGS', 'METH_O', 'METH_VARARGS', 'Arg',
+           'pointer_descriptor_name', 'spell', 'METH_FASTCALL', 'METH_NOARGS', 'METH_O', 'METH_VARARGS', 'Arg',
            'Candidate', 'Cast', 'Companion', 'Constant', 'Descriptor', 'DirectorClass',
            'DispatchRule', 'EntryPoint', 'Forward', 'ForwardArg', 'ForwardResult',
            'GlobalVariable', 'MethodEntry', 'Module', 'PointerClass', 'Result', 'WrappedClass']

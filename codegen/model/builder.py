@@ -6,7 +6,7 @@ import keyword
 
 from ..manifest import Manifest
 from ..parse import Class, CType, Function, Headers, Param, Variable
-from . import conversions
+from . import conversions, protocols
 from .dispatch import dispatch_rules
 from .docs import document
 from .pytypes import TypeScope
@@ -90,7 +90,8 @@ class Builder:
         slot = first - 1
         for j, p in enumerate(fn.params):
             arg = conversions.argument(first + j, slot, p, entry, self.descriptor_for,
-                                       self.m.callable_announcement, cls)
+                                       self.m.callable_announcement, cls, self.m.strict_scalars,
+                                       self.m.value_protocols)
             arg.name = p.name or f'arg{j + 1}'
             if arg.slot is not None:
                 slot += 1
@@ -203,7 +204,8 @@ class Builder:
                                               self.class_descriptor(cls.name))]
             if what == 'set':
                 value = conversions.argument(2, 1, Param(v.name, v.type), entry,
-                                             self.descriptor_for, '', cls.name)
+                                             self.descriptor_for, '', cls.name,
+                                             self.m.strict_scalars)
                 value.disown = v.type.kind == 'pointer' and v.type.inner.name in directors
                 value.name = v.name
                 args.append(value)
@@ -337,6 +339,8 @@ class Builder:
     def build(self) -> Module:
         pointer_classes = [self.pointer_class(n, t) for n, t in self.m.pointer_classes]
         classes = [self.wrapped_class(e) for e in self.m.classes]
+        if self.m.value_protocols:
+            protocols.decide(self, classes)
         repeated = sorted(n for n in self.m.types if n in self.descriptors)
         if repeated:
             raise GeneratorError(f'{self.m.source}: the headers derive these types; remove them '
@@ -364,8 +368,8 @@ class Builder:
                 entries.append(MethodEntry(c.constructor.entry, c.constructor.function,
                                            c.constructor.flags, True))
             entries.append(MethodEntry(c.delete_entry, f'wrap_{c.delete_entry}', METH_O, True))
-            entries += [MethodEntry(m.entry, m.function, m.flags, bool(m.candidates))
-                        for m in c.members]
+            entries += [MethodEntry(m.entry, m.function, m.flags,
+                                    bool(m.candidates or m.protocol)) for m in c.members]
             # A writable static variable is also reached through its own pair of
             # functions, on which the proxy class builds a class property; a
             # read-only one only through cvar.
@@ -393,8 +397,16 @@ class Builder:
         module = Module(self.m.name, self.m.proxy, self.m.source, self.m.namespace,
                         [c.header for c in self.m.classes], self.m.imports, pointer_classes,
                         classes, descriptors, entries, start, installs, api, functions,
-                        [(self.m.resource_table, key) for key in self.m.resources])
-        document(module, self.type_scope())
+                        [(self.m.resource_table, key) for key in self.m.resources],
+                        self.m.value_protocols, self.m.strict_scalars)
+        scope = self.type_scope()
+        for c in classes:
+            shape = c.protocols.shape if c.protocols else None
+            if shape and shape.python:
+                scope.sequences[c.name] = shape.python
+            if shape:
+                scope.shapes[c.name] = shape.itself
+        document(module, scope)
         return module
 
     def type_scope(self) -> TypeScope:

@@ -13,6 +13,12 @@ from .naming import GeneratorError, spell, unqualified
 SCALAR_CONVERTERS = {'int': 'AsInt', 'unsigned int': 'AsUnsignedInt', 'short': 'AsShort',
                      'unsigned char': 'AsUnsignedChar', 'char': 'AsChar', 'bool': 'AsBool',
                      'double': 'AsDouble', 'float': 'AsFloat'}
+# The same where scalars are strict: a boolean is a bool, and a number is
+# anything Python's number protocols make one of (numpy's scalars among them).
+STRICT_CONVERTERS = {'int': 'AsNumberInt', 'unsigned int': 'AsNumberUnsignedInt',
+                     'short': 'AsNumberShort', 'unsigned char': 'AsNumberUnsignedChar',
+                     'char': 'AsChar', 'bool': 'AsStrictBool', 'double': 'AsNumberDouble',
+                     'float': 'AsNumberFloat'}
 # Scalar result types and the call that makes their Python value.
 SCALAR_RESULTS = {'int': 'PyLong_FromLong', 'short': 'PyLong_FromLong',
                   'unsigned char': 'PyLong_FromLong', 'unsigned int': 'PyLong_FromSize_t',
@@ -69,11 +75,24 @@ def _function_pointer(t: CType) -> bool:
     return t.kind == 'pointer' and t.inner.kind == 'function'
 
 
+def scalar_converter(name: str, strict: bool) -> str:
+    return (STRICT_CONVERTERS if strict else SCALAR_CONVERTERS)[name]
+
+
 def argument(number: int, slot: int | None, p: Param, entry: str,
-             descriptor_for: DescriptorFor, announce: str = '', scope: str = '') -> Arg:
-    """How parameter `p`, argument `number` of `entry`, is filled."""
+             descriptor_for: DescriptorFor, announce: str = '', scope: str = '',
+             strict: bool = False, outputs: bool = False) -> Arg:
+    """How parameter `p`, argument `number` of `entry`, is filled. Where
+    scalars are `strict`, a string argument that does not convert stops the
+    call with the argument's message, as a wrapped object's does. With
+    `outputs`, a writable array of numbers is the host's to fill, and Python
+    gets it back with the result."""
     t = p.type
     declared = spell(t)
+    numbers = number_array(t)
+    if outputs and numbers and not _innermost(t).const:
+        return Arg(number, None, declared, 'array_out', numbers[0], shape=numbers[1],
+                   converter=SCALAR_RESULTS[numbers[0]], name=p.name)
     # An array parameter is a pointer to its first element, which the host
     # reads: a null one is refused as a null reference is.
     array = t.kind == 'array'
@@ -109,10 +128,11 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
             if default is None:
                 raise unsupported()
         if scalar.kind == 'enum':
-            return Arg(number, slot, s, 'scalar', 'int', method + f"'{s}'", converter='AsInt',
-                       cast=scalar.name, default=default)
+            return Arg(number, slot, s, 'scalar', 'int', method + f"'{s}'",
+                       converter=scalar_converter('int', strict), cast=scalar.name,
+                       default=default)
         return Arg(number, slot, s, 'scalar', scalar.name, method + f"'{s}'",
-                   converter=SCALAR_CONVERTERS[scalar.name], default=default)
+                   converter=scalar_converter(scalar.name, strict), default=default)
 
     string_like = t if t.kind == 'record' else inner if t.kind == 'lvref' else None
     if string_like is not None and string_like.kind == 'record' and \
@@ -128,10 +148,12 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
                 # A literal, or a static of the member's class.
                 default = p.default if p.default.startswith('"') else (
                     p.default if '::' in p.default or not scope else f'{scope}::{p.default}')
-            return Arg(number, slot, spell(t), 'string', default=default,
-                       message=f'Expected a String or Unicode object for argument {number}')
-        return Arg(number, slot, spell(t), 'string_array',
-                   message=f'Expected a list of Strings or Unicode objects for argument {number}',
+            return Arg(number, slot, spell(t), 'string', default=default, strict=strict,
+                       message=method + f"'{spell(t)}'" if strict else
+                       f'Expected a String or Unicode object for argument {number}')
+        return Arg(number, slot, spell(t), 'string_array', strict=strict,
+                   message=method + f"'{spell(t)}'" if strict else
+                   f'Expected a list of Strings or Unicode objects for argument {number}',
                    output=output,
                    list_messages=(f'Argument {number} must be a list object',
                                   f'Unable to modify argument {number} to return results'))
@@ -140,8 +162,9 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
         # Every pointer parameter has its descriptor, whatever fills it.
         descriptor_for(inner)
     if t.kind == 'pointer' and inner.kind == 'record' and inner.name == STRING:
-        return Arg(number, slot, spell(t), 'string_ptr', default=null_default(),
-                   message=f'Expected a String or Unicode object for argument {number}')
+        return Arg(number, slot, spell(t), 'string_ptr', default=null_default(), strict=strict,
+                   message=method + f"'{spell(t)}'" if strict else
+                   f'Expected a String or Unicode object for argument {number}')
     if t.kind == 'pointer' and _is(inner, 'builtin', 'char'):
         default = p.default
         if default is not None and default not in _NULL_DEFAULTS and \
@@ -172,7 +195,32 @@ def argument(number: int, slot: int | None, p: Param, entry: str,
     return Arg(number, slot, s, 'object', spell(CType('pointer', inner=target)), method + f"'{s}'",
                descriptor=descriptor_for(target), reference=ref,
                null_message=f"invalid null reference {method}'{s}'" if ref else None,
-               default=default, array=array)
+               default=default, array=array, array_of=numbers if array else None)
+
+
+def _innermost(t: CType) -> CType:
+    while t.kind == 'array':
+        t = t.inner
+    return t
+
+
+def _dims(t: CType) -> tuple[int, ...]:
+    dims = []
+    while t.kind == 'array':
+        dims.append(t.size)
+        t = t.inner
+    return tuple(dims)
+
+
+def number_array(t: CType) -> tuple[str, tuple[int, ...]] | None:
+    """The element type and the dimensions of an array of numbers
+    (`double [4][4]`), or None."""
+    if t.kind != 'array':
+        return None
+    element = _scalar_target(_innermost(t))
+    if element.kind != 'builtin' or element.name not in SCALAR_RESULTS or element.name == 'char':
+        return None
+    return element.name, _dims(t)
 
 
 def self_argument(cls: str, entry: str, const: bool, descriptor: Descriptor) -> Arg:

@@ -82,6 +82,11 @@ def class_doc(c: WrappedClass, home: str) -> str:
     return '\n\n'.join(parts)
 
 
+def _text_signature(forms) -> str | None:
+    params = {len(f.params) for f in forms}
+    return forms[0].text_signature() if len(params) == 1 else None
+
+
 def document(module: Module, scope: TypeScope):
     """Gives every member, operation and class its Python types and texts."""
     home = module.proxy
@@ -102,7 +107,11 @@ def document(module: Module, scope: TypeScope):
             name = ep.member or c.name
             for cand in ep.candidates:
                 cand.python = scope.signature(name, cand, ep.comparison)
-            ep.forms = distinct_forms([cand.python for cand in ep.candidates])
+            if ep.candidates:
+                ep.forms = distinct_forms([cand.python for cand in ep.candidates], scope.shapes)
+            elif ep.protocol:   # its forms are the protocol's
+                ep.doc = '\n'.join(form.describe(home) for form in ep.forms)
+                ep.text_signature = _text_signature(ep.forms)
             if not ep.candidates or ep.accessor == 'set' or ep is c.constructor:
                 continue
             if ep.accessor:

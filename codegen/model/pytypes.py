@@ -35,6 +35,28 @@ POINTER_OBJECT = ClassRef('', 'SwigPyObject')
 
 
 @dataclass(frozen=True)
+class Generic:
+    """A generic type over Python types: `_Sequence[VPoint | _Sequence[float]]`.
+    A name with a leading '_' is a stub-only protocol of the package, shown
+    without it in documentation."""
+    name: str
+    args: tuple
+
+
+def _option(o, home: str, stub: bool) -> str:
+    if isinstance(o, str):
+        return o
+    if isinstance(o, Generic):
+        name = o.name if stub else o.name.lstrip('_')
+        return f'{name}[{", ".join(a.render(home, stub) for a in o.args)}]'
+    if not o.module:
+        return '_' + o.name if stub else o.name
+    if o.module == home:
+        return o.name
+    return f'{o.module}.{o.name}'
+
+
+@dataclass(frozen=True)
 class PyType:
     """A union of Python types: names of built-in types and typing forms,
     and classes of the modules."""
@@ -43,21 +65,19 @@ class PyType:
     def render(self, home: str, stub: bool = False) -> str:
         """The annotation written in the proxy module `home` (or its stub: the
         wrapped pointer is a stub-only class of the package there)."""
-        out = []
-        for o in self.options:
-            if isinstance(o, str):
-                out.append(o)
-            elif not o.module:
-                out.append('_' + o.name if stub else o.name)
-            elif o.module == home:
-                out.append(o.name)
-            else:
-                out.append(f'{o.module}.{o.name}')
-        return ' | '.join(out)
+        return ' | '.join(_option(o, home, stub) for o in self.options)
 
     @property
     def modules(self) -> set[str]:
-        return {o.module for o in self.options if isinstance(o, ClassRef)}
+        out = set()
+        for o in self.options:
+            if isinstance(o, ClassRef):
+                out.add(o.module)
+            elif isinstance(o, Generic):
+                out |= {o.name} if o.name.startswith('_') else set()
+                for a in o.args:
+                    out |= a.modules
+        return out
 
     def __or__(self, other: 'PyType') -> 'PyType':
         return PyType(self.options + tuple(o for o in other.options if o not in self.options))
@@ -113,6 +133,10 @@ class TypeScope:
     classes: dict[str, ClassRef] = field(default_factory=dict)
     pointer_elements: dict[str, ClassRef] = field(default_factory=dict)
     enumerators: dict[str, int] = field(default_factory=dict)   # "Class::kName" -> value
+    # The Python sequences that stand for a class's objects, and the sequence
+    # each class with a shape is itself, by class name.
+    sequences: dict[str, PyType] = field(default_factory=dict)
+    shapes: dict[str, PyType] = field(default_factory=dict)
 
     def add_module(self, proxy: str, classes: list[str], pointer_classes: list[tuple[str, str]]):
         for name in classes:
@@ -140,6 +164,13 @@ class TypeScope:
             return INT if a.cast else of(SCALAR_TYPES[a.cpp])
         if a.kind == 'object':
             t = self.object(a.descriptor, True)
+            if a.numbers:   # nested sequences of numbers of its dimensions
+                nested = of(SCALAR_TYPES[a.numbers[0]])
+                for _ in a.shape:
+                    nested = of(Generic('_Sequence', (nested,)))
+                t = t | nested
+            elif a.sequence:
+                t = t | self.sequences.get(a.value_type, ANY)
             return t if a.reference or t == ANY else t | NONE
         if a.kind == 'string':
             return STR
@@ -227,7 +258,17 @@ class TypeScope:
                   for a in cand.args if a.slot is not None and not a.is_self]
         if comparison:   # an operand that does not convert compares unequal
             params[0].type = OBJECT
-        return PySignature(name, params, self.result(cand.result))
+        result = self.result(cand.result)
+        outputs = [of(_nested_list(SCALAR_TYPES[a.cpp], len(a.shape)))
+                   for a in cand.args if a.kind == 'array_out']
+        if outputs:
+            # The arrays the host fills replace a status or nothing, and
+            # follow any other result.
+            if cand.result.kind not in ('void', 'status'):
+                outputs.insert(0, result)
+            result = outputs[0] if len(outputs) == 1 else of(
+                f'tuple[{", ".join(t.render(self.home, True) for t in outputs)}]')
+        return PySignature(name, params, result)
 
     def pointer_class(self, p) -> list[tuple[PySignature, bool]]:
         """The members of a pointer class, with whether each is static."""
@@ -249,24 +290,43 @@ class TypeScope:
 _TAKES = {'int': {'bool'}, 'float': {'int', 'bool'}}
 
 
-def _covers(a: PyType, b: PyType) -> bool:
-    taken = set(a.options)
-    for o in a.options:
-        taken |= _TAKES.get(o, set()) if isinstance(o, str) else set()
-    return set(b.options) <= taken
+def _covers(a: PyType, b: PyType, shapes: dict | None = None) -> bool:
+    """Whether `a` takes everything `b` does. `shapes` gives the sequence a
+    class of the modules is (a point is a sequence of float), since a type
+    checker sees it as one."""
+    return all(_covers_option(a, o, shapes or {}) for o in b.options)
 
 
-def distinct_forms(sigs: list[PySignature]) -> list[PySignature]:
+def _covers_option(a: PyType, o, shapes: dict) -> bool:
+    if o in a.options:
+        return True
+    if isinstance(o, str):
+        return any(isinstance(t, str) and o in _TAKES.get(t, ()) for t in a.options)
+    if isinstance(o, ClassRef) and o.name in shapes:
+        return _covers(a, shapes[o.name], shapes)
+    if isinstance(o, Generic):
+        return any(isinstance(t, Generic) and t.name == o.name and len(t.args) == len(o.args)
+                   and all(_covers(x, y, shapes) for x, y in zip(t.args, o.args))
+                   for t in a.options)
+    return False
+
+
+def distinct_forms(sigs: list[PySignature], shapes: dict | None = None) -> list[PySignature]:
     """The forms of an overloaded member as Python tells them apart: a form
     whose every call an earlier one also takes (`int` after `int`, or `str`
-    after `str | None`) is left out."""
+    after `str | None`, or a point after a sequence of numbers) is left out."""
     out: list[PySignature] = []
     for sig in sigs:
         if not any(len(f.params) == len(sig.params) and
-                   all((p.default is None) == (q.default is None) and _covers(p.type, q.type)
+                   all((p.default is None) == (q.default is None) and
+                       _covers(p.type, q.type, shapes)
                        for p, q in zip(f.params, sig.params)) for f in out):
             out.append(sig)
     return out
+
+
+def _nested_list(element: str, depth: int) -> str:
+    return 'list[' * depth + element + ']' * depth
 
 
 def python_name(name: str) -> str:

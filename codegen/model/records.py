@@ -5,13 +5,18 @@ from __future__ import annotations
 import dataclasses
 import hashlib
 import struct
+from typing import TYPE_CHECKING
 from dataclasses import dataclass, field
 
 from .pytypes import PySignature, PyType
 
+if TYPE_CHECKING:
+    from .protocols import Protocols
+
 METH_VARARGS = 1
 METH_NOARGS = 4
 METH_O = 8
+METH_FASTCALL = 0x80   # the arguments as an array: the special methods of values
 
 
 @dataclass
@@ -41,7 +46,8 @@ class Arg:
     kind: scalar, object (a wrapped pointer), string, string_array, string_ptr
     (an optional `VString const *`), chars (`char const *`), status_out (a
     `VStatus *` the wrapper owns), pyobject (passed through), callable (a
-    Python object standing for a function pointer, referenced and announced)."""
+    Python object standing for a function pointer, referenced and announced),
+    array_out (an array of numbers the host fills, returned as nested lists)."""
     number: int                  # position in messages, counted from 1 with self
     slot: int | None             # index in the Python arguments; None when not from Python
     spelling: str
@@ -62,6 +68,17 @@ class Arg:
     array: bool = False          # object: an array, passed as the pointer to its first
                                  # element, null refused like a reference
     name: str = ''               # the parameter's name in the header
+    strict: bool = False         # string kinds: a wrong one stops the call
+    # object: a Python sequence of the class's shape stands for the object,
+    # read by this function (`SequenceTo_VPoint`) into a local of `value_type`
+    sequence: str = ''
+    value_type: str = ''
+    shape: tuple = ()            # array_out, and an object that is an array of
+                                 # numbers read from nested sequences: its dimensions
+    # the element of an array of numbers read from nested sequences:
+    # (C++ type, convert/ routine)
+    numbers: tuple[str, str] | None = None
+    array_of: tuple | None = None   # an array of numbers: (element, dimensions)
 
     @property
     def optional(self) -> bool:
@@ -98,6 +115,10 @@ class Candidate:
     owner: str = ''              # the class that declares the member
     doc: str = ''                # the header's comment on the declaration
     python: 'PySignature | None' = None   # as Python calls it
+    # An operator: member (self.operator@(other)), free (operator@(self,
+    # other)), reflected (operator@(other, self)), commuted (self.operator@(
+    # other) for other @ self), call (self(indices...) within the bounds).
+    operator: str = ''
 
 
 @dataclass
@@ -129,6 +150,11 @@ class EntryPoint:
     # The forms Python tells apart (`field` above is a member's name here).
     forms: list['PySignature'] = dataclasses.field(default_factory=list)
     text_signature: str | None = None   # its __text_signature__, when it has one form
+    # A special method of Python's data model the class has as a value (see
+    # protocols.py): operator, unary, call, len, getitem, setitem, iter, repr,
+    # hash, str, text_eq, text_ne.
+    protocol: str = ''
+    self_arg: Arg | None = None   # `self` of a protocol without candidates
 
     @property
     def converts_objects(self) -> bool:
@@ -201,6 +227,7 @@ class WrappedClass:
     director_class: 'DirectorClass | None' = None
     comment: str = ''             # the header's comment on the class
     doc: str = ''                 # __doc__ of the proxy class
+    protocols: 'Protocols | None' = None   # with the module's value protocols
 
     @property
     def delete_entry(self) -> str:
@@ -234,6 +261,8 @@ class Module:
     api_version: str
     functions: list[MethodEntry] = field(default_factory=list)   # hand-written free functions
     resources: list[tuple[str, str]] = field(default_factory=list)  # (table, key), in order
+    value_protocols: bool = False  # its classes are Python values (see protocols.py)
+    strict_scalars: bool = False
 
     @property
     def directors(self) -> list['DirectorClass']:

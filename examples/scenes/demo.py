@@ -7,7 +7,8 @@
           --plugin examples/plugins/wave_deformer.py \\
           --plugin examples/plugins/marker_locator.py \\
           --plugin examples/plugins/snap_transform.py \\
-          --plugin examples/plugins/scatter_command.py examples/scenes/demo.py
+          --plugin examples/plugins/scatter_command.py \\
+          --plugin examples/plugins/point_cloud.py examples/scenes/demo.py
 """
 import math
 import os
@@ -94,6 +95,18 @@ def show_translator():
         vorla.delete_node(name)
 
 
+def show_point_cloud():
+    heading('pointCloud: points placed by a matrix, measured as Python values')
+    node = vorla.create_node('pointCloud')
+    vorla.set_attr(node + '.points', [[0, 0, 0], [2, 0, 0], [1, 3, 0]])
+    vorla.set_attr(node + '.placement', [[1, 0, 0, 0], [0, 1, 0, 0], [0, 0, 1, 0], [5, 0, 0, 1]])
+    print(f'{node}.points [[0, 0, 0], [2, 0, 0], [1, 3, 0]], moved 5 along x:')
+    print(f'  placed   {vorla.get_attr(node + ".placed")}')
+    print(f'  centroid {vorla.get_attr(node + ".centroid")}, '
+          f'radius {vorla.get_attr(node + ".radius"):.6f}')
+    vorla.delete_node(node)
+
+
 def show_threads(count=200, threads=4):
     heading(f'{count} sineNodes evaluated on host threads')
     nodes = [vorla.create_node('sineNode') for _ in range(count)]
@@ -167,4 +180,5 @@ show_translator()
 show_deformer()
 show_locator_and_transform()
 show_scatter()
+show_point_cloud()
 show_threads()

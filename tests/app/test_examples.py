@@ -219,3 +219,23 @@ def test_scatter_command_with_flags_undo_and_misuse(vorla):
         "The flag '-count' of the command 'scatter' takes an integer of 0 or more, not -2",
         "The flag '-range' of the command 'scatter' takes 2 arguments, not 1",
         "The command 'scatter' has no flag '-x'"]
+
+
+def test_point_cloud_places_and_measures_points_as_python_values(vorla):
+    lines = run(vorla, ['point_cloud.py'], '''
+        node = vorla.create_node('pointCloud')
+        print(vorla.get_attr(node + '.placed'), vorla.get_attr(node + '.centroid'))
+        vorla.set_attr(node + '.points', [[0, 0, 0], [2, 0, 0], [1, 3, 0]])
+        vorla.set_attr(node + '.placement', [[2, 0, 0, 0], [0, 2, 0, 0], [0, 0, 2, 0], [5, 0, 0, 1]])
+        print(vorla.get_attr(node + '.placed'))
+        print(vorla.get_attr(node + '.centroid'), vorla.get_attr(node + '.radius'))
+        others = [vorla.create_node('pointCloud') for _ in range(6)]
+        for i, other in enumerate(others):
+            vorla.set_attr(other + '.points', [[x, i, 0] for x in range(i + 1)])
+        vorla.evaluate(threads=3)
+        print([vorla.get_attr(o + '.centroid') for o in others[:3]], vorla.log())
+        ''')
+    assert lines == ['[] [0.0, 0.0, 0.0]',
+                     '[[5.0, 0.0, 0.0], [9.0, 0.0, 0.0], [7.0, 6.0, 0.0]]',
+                     '[7.0, 2.0, 0.0] 4.0',
+                     '[[0.0, 0.0, 0.0], [0.5, 1.0, 0.0], [1.0, 2.0, 0.0]] []']

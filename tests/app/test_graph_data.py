@@ -192,3 +192,69 @@ def test_the_host_asks_deformers_to_deform_and_transforms_for_their_matrix(vorla
         "['translate', 'rotate', 'scale', 'matrix']",
         # Composed by the transform's own matrix, a Python subclass here.
         '[1.0, 2.0, 3.0, 1.0] [(1.0, 2.0, 3.0)]']
+
+
+VALUES_PLUGIN = '''
+import numpy as np
+from openvorla import OpenVorla as ov, OpenVorlaVPx as vpx
+
+MIRROR = ov.VMatrix(np.diag([-1.0, 1.0, 1.0, 1.0]))
+
+
+class Mirror(vpx.VPxNode):
+    source = image = ov.VObject()
+
+    def compute(self, plug, data):
+        if plug.attribute() != Mirror.image:
+            return 'unknown'
+        point = ov.VPoint(data.inputValue(Mirror.source).asVector())
+        data.outputValue(Mirror.image).setMVector(list(point * MIRROR)[:3])
+        data.setClean(plug)
+
+
+def initialize():
+    numeric = ov.VFnNumericAttribute()
+    Mirror.source = numeric.createPoint('source', 's')
+    Mirror.image = numeric.createPoint('image', 'i')
+    numeric.setWritable(False)
+    for attribute in (Mirror.source, Mirror.image):
+        vpx.VPxNode.addAttribute(attribute)
+    vpx.VPxNode.attributeAffects(Mirror.source, Mirror.image)
+
+
+def round_trips():
+    """Values handed to the host and read back from it."""
+    points = np.array([[1.0, 2.0, 3.0], [4.0, 5.0, 6.0]])
+    cases = [(ov.VFnDoubleArrayData(), [0.5, 1.5], ov.VDoubleArray),
+             (ov.VFnIntArrayData(), np.arange(4), ov.VIntArray),
+             (ov.VFnPointArrayData(), points, ov.VPointArray),
+             (ov.VFnVectorArrayData(), points.tolist(), ov.VVectorArray)]
+    out = []
+    for fn, given, cls in cases:
+        fn.create(given)
+        back = fn.array()
+        out.append(type(back) is cls and back == cls(given) and len(back) == len(given))
+    matrix = ov.VFnMatrixData()
+    matrix.create([[2, 0, 0, 0], [0, 2, 0, 0], [0, 0, 2, 0], [1, 2, 3, 1]])
+    out.append(matrix.matrix().get()[3] == [1.0, 2.0, 3.0, 1.0])
+    return out
+
+
+def initializePlugin(obj):
+    print(round_trips())
+    vpx.VFnPlugin(obj).registerNode('mirror', ov.VTypeId(0x7A985), Mirror, initialize)
+
+
+def uninitializePlugin(obj):
+    vpx.VFnPlugin(obj).deregisterNode(ov.VTypeId(0x7A985))
+'''
+
+
+def test_values_round_trip_through_the_host(vorla):
+    lines = vorla.ok('--plugin', vorla.file('mirror.py', VALUES_PLUGIN), script='''
+        import vorla
+        n = vorla.create_node('mirror')
+        vorla.set_attr(n + '.source', [1, 2, 3])
+        print(vorla.get_attr(n + '.source'), vorla.get_attr(n + '.image'), vorla.log())
+    ''')
+    assert lines == ['[True, True, True, True, True]', '[1.0, 2.0, 3.0] [-1.0, 2.0, 3.0] []']

@@ -1,4 +1,5 @@
-"""The emitted text for the fixture SDK, compared whole with blessed copies.
+"""The emitted text for the fixture SDK's two modules (the second, values/,
+with value protocols and strict scalars), compared whole with blessed copies.
 
 After an intended change of the output, re-bless with
     OPENVORLA_BLESS=1 /usr/bin/python3 -m pytest tests/codegen/test_golden.py
@@ -15,18 +16,24 @@ HERE = os.path.dirname(__file__)
 GOLDEN = os.path.join(HERE, 'golden')
 
 
+MODULES = {'': 'tests/codegen/fixtures/fixture.toml',
+           'values/': 'tests/codegen/fixtures/values.toml'}
+
+
 def outputs():
+    files = {}
     cwd = os.getcwd()
     os.chdir(os.path.dirname(os.path.dirname(HERE)))  # banners name the manifest relative to the root
     try:
-        module = load_module('tests/codegen/fixtures/fixture.toml',
-                             ['tests/codegen/fixtures/include'])
+        modules = {d: load_module(m, ['tests/codegen/fixtures/include']) for d, m in MODULES.items()}
     finally:
         os.chdir(cwd)
-    files = render(module)
-    files['Fixture.py'] = proxy.emit(module)
-    files['Fixture.pyi'] = stubs.emit_proxy(module)
-    files['_Fixture.pyi'] = stubs.emit_extension(module)
+    for folder, module in modules.items():
+        mine = render(module)
+        mine[f'{module.proxy}.py'] = proxy.emit(module)
+        mine[f'{module.proxy}.pyi'] = stubs.emit_proxy(module)
+        mine[f'{module.name}.pyi'] = stubs.emit_extension(module)
+        files.update({folder + name: text for name, text in mine.items()})
     return files
 
 

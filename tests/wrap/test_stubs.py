@@ -65,6 +65,9 @@ def initialize() -> None:
     vpx.VPxNode().getFilesToArchive(True, False, False, True)
     flag = vpx.boolPtr()
     Node().legalConnection(ov.VPlug(), ov.VPlug(), True, flag)
+    points = ov.VPointArray([[1, 2, 3], (4, 5, 6), ov.VPoint(), 'x'])
+    gap: float = points[0] - points[1]
+    rows: list[list[float]] = ov.VMatrix([[1, 0], [0, 1]]).get()
 '''
 
 
@@ -72,7 +75,8 @@ def test_a_plugins_mistakes_are_found(cache, tmp_path):
     (tmp_path / 'mistakes.py').write_text(MISTAKES)
     run = mypy('mypy', '--no-error-summary', '--hide-error-context', str(tmp_path / 'mistakes.py'),
                cache=cache)
-    errors = [line.partition(': error: ')[2] for line in run.stdout.splitlines()]
+    errors = [line.partition(': error: ')[2] for line in run.stdout.splitlines()
+              if ': error: ' in line]   # not the notes that explain them
     assert errors == [
         'Return type "int" of "compute" incompatible with return type '
         '"Optional[Literal[\'unknown\']]" in supertype "VPxNode"  [override]',
@@ -83,4 +87,7 @@ def test_a_plugins_mistakes_are_found(cache, tmp_path):
         'Incompatible types in assignment (expression has type "str", variable has type '
         '"int")  [assignment]',
         'Too many arguments for "getFilesToArchive" of "VPxNode"  [call-arg]',
+        'List item 3 has incompatible type "str"; expected "_Sequence[float]"  [list-item]',
+        'Incompatible types in assignment (expression has type "VVector", variable has type '
+        '"float")  [assignment]',
     ]
