@@ -175,6 +175,17 @@ PyObject *NewPointerObj(PyObject *, void *ptr, swig_type_info *ty, int flags) {
   return inst;
 }
 
+PyObject *LentPointerObj(PyObject *self, void *ptr, swig_type_info *ty) {
+  PyObject *result = NewPointerObj(nullptr, ptr, ty, 0);
+  // A proxy instance made here and nowhere else keeps its lender in its own
+  // dictionary; a bare wrapper has no room for it and stays as it is.
+  if (result && result != Py_None && !SwigPyObject_Check(result) && Py_REFCNT(result) == 1) {
+    static PyObject *lender = PyUnicode_InternFromString("_lender");
+    if (!lender || PyObject_GenericSetAttr(result, lender, self) < 0) Py_CLEAR(result);
+  }
+  return result;
+}
+
 int ConvertFunctionPtr(PyObject *obj, void **out, swig_type_info *ty) {
   if (!PyCFunction_Check(obj)) return ConvertPtr(obj, out, ty, 0);
   // A built-in function stands for a C function pointer only through the

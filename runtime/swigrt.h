@@ -227,6 +227,19 @@ swig_cast_info *TypeCheck(const char *source_name, swig_type_info *target);
 swig_type_info *TypeQuery(const char *type_string);
 int ConvertPtr(PyObject *obj, void **out, swig_type_info *ty, int flags, int *own = nullptr);
 PyObject *NewPointerObj(PyObject *self, void *ptr, swig_type_info *ty, int flags);
+// A pointer or reference that a member returns is lent by the object the
+// member was called on (`self`): it may lead into it (a reference to one of
+// its members). The new wrapper does not own `ptr` and keeps `self` alive,
+// so that `owner().part()` on a temporary owner stays valid.
+PyObject *LentPointerObj(PyObject *self, void *ptr, swig_type_info *ty);
+// As LentPointerObj, for a result of the member's own class: when it is the
+// object itself (`return *this`, whose pointer is `self_ptr`), the call gives
+// back `self` (so `a.add(1).add(2)` chains on a temporary).
+inline PyObject *SelfOrLentPointerObj(PyObject *self, void *self_ptr, void *ptr,
+                                      swig_type_info *ty) {
+  if (ptr && ptr == self_ptr) return Py_NewRef(self);
+  return LentPointerObj(self, ptr, ty);
+}
 int ConvertFunctionPtr(PyObject *obj, void **out, swig_type_info *ty);
 int AcquireOwnership(PyObject *obj, int own);  // ownership take-over
 

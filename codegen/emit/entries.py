@@ -172,6 +172,13 @@ def _result(c: Candidate, call: str, declare: bool = True) -> str:
         return (f'  VStatus result = {call};\n'
                 f'  {target} = swigrt::StatusResult(result);\n'
                 '  if (!resultobj) return nullptr;\n')
+    if r.lent:
+        me = c.args[0]
+        pointer = f'const_cast<{r.cpp} *>({call if r.kind == "pointer" else "&" + call})'
+        make = (f'swigrt::SelfOrLentPointerObj({_slot(me)}, argp{me.number}, {pointer}, '
+                f'{r.descriptor.macro})' if r.may_be_self else
+                f'swigrt::LentPointerObj({_slot(me)}, {pointer}, {r.descriptor.macro})')
+        return f'  {target} = {make};\n  if (!resultobj) return nullptr;\n'
     make = {
         'scalar': lambda: (f'{r.converter}(static_cast<long>({call}))'
                            if r.converter == 'PyLong_FromLong' else f'{r.converter}({call})'),

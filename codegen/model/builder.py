@@ -105,6 +105,9 @@ class Builder:
         proto = f"{cls}::{name}({','.join(types)})" + (' const' if fn.const else '')
         res = Result('value', cls, descriptor=self.class_descriptor(cls)) if ctor else \
             conversions.result(fn.result, entry, self.descriptor_for)
+        if not ctor and not fn.static and res.kind in ('pointer', 'reference'):
+            res.lent = True
+            res.may_be_self = res.descriptor is self.class_descriptor(cls)
         return Candidate(function, proto, required, base + len(python), args, res,
                          f'new {cls}' if ctor else fn.name, fn.static, fn.const)
 

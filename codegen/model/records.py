@@ -95,6 +95,12 @@ class Result:
     cpp: str = ''                # the C++ type of the local holding the result
     converter: str = ''          # scalar: the Python constructor
     descriptor: Descriptor | None = None
+    # A member's pointer or reference: lent by the object the member was
+    # called on, which the result keeps alive; of the member's own class, it
+    # may be that object itself (`return *this`), which the call then gives
+    # back.
+    lent: bool = False
+    may_be_self: bool = False
 
 
 @dataclass

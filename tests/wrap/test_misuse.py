@@ -176,3 +176,20 @@ def test_a_value_either_module_made_keeps_its_destructor_until_it_goes():
         print('gone')
     ''')
     assert out == ['gone']
+
+
+def test_a_result_lent_by_a_temporary_keeps_it_alive():
+    # `return *this` gives back the object itself; a reference into an object
+    # keeps that object alive; neither may outlive what it points into.
+    out = child('''
+        args = ov.VArgList().addArg(True).addArg(2).addArg('x')
+        fresh = ov.VArgList()
+        print(args.length(), args.asString(2), fresh.addArg(1) is fresh)
+        class Context(vpx.VPxContextCommand):
+            pass
+        syntax = Context().syntax()
+        gc.collect()
+        junk = [Context() for _ in range(100)]
+        print(syntax.numberOfFlags(), type(syntax._lender).__name__)
+        ''')
+    assert out == ['3 x True', '0 Context']

@@ -79,7 +79,7 @@ PyObject *wrap_Node_parent(PyObject *, PyObject *arg) try {
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_parent', argument 1 of type 'Node *'", "invalid null reference in method 'Node_parent', argument 1 of type 'Node *'")) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Node *>(static_cast<Node *>(argp1)->parent()), SWIGTYPE_p_Node, 0);
+  PyObject *resultobj = swigrt::SelfOrLentPointerObj(argv[0], argp1, const_cast<Node *>(static_cast<Node *>(argp1)->parent()), SWIGTYPE_p_Node);
   if (!resultobj) return nullptr;
   return resultobj;
 } catch (...) {
@@ -92,7 +92,7 @@ PyObject *wrap_Node_value(PyObject *, PyObject *arg) try {
   PyObject *argv[1] = {arg};
   void *argp1 = nullptr;
   if (!swigrt::ReferenceArg(argv[0], SWIGTYPE_p_Node, &argp1, "in method 'Node_value', argument 1 of type 'Node const *'", "invalid null reference in method 'Node_value', argument 1 of type 'Node const *'")) return nullptr;
-  PyObject *resultobj = swigrt::NewPointerObj(nullptr, const_cast<Value *>(&static_cast<Node *>(argp1)->value()), SWIGTYPE_p_Value, 0);
+  PyObject *resultobj = swigrt::LentPointerObj(argv[0], const_cast<Value *>(&static_cast<Node *>(argp1)->value()), SWIGTYPE_p_Value);
   if (!resultobj) return nullptr;
   return resultobj;
 } catch (...) {
