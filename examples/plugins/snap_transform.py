@@ -16,7 +16,7 @@ GRID = 0.5
 
 
 class SnapMatrix(vpx.VPxTransformationMatrix):
-    type_id = ov.VTypeId(0x7A213)
+    type_id = ov.VTypeId(0x7A214)
 
     def translateTo(self, vector, space):
         snapped = ov.VVector(*(round(c / GRID) * GRID for c in (vector.x, vector.y, vector.z)))
